@@ -1,0 +1,12 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include <EditorModel/Export.h>
+
+namespace Types {
+
+/// True where both values are within 1e-12 of zero, or where they differ by at most the lesser magnitude
+/// divided by 1e12. Infinities and not-a-number are equal to nothing, themselves included.
+EDITORMODEL_EXPORT bool fuzzyEqual(double a, double b);
+
+} // namespace Types

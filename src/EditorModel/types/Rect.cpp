@@ -1,0 +1,22 @@
+// SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/types/Rect.h>
+
+#include <EditorModel/types/FuzzyCompare.h>
+
+namespace Types {
+
+Rect::Rect() = default;
+
+Rect::Rect(double left_, double top_, double right_, double bottom_)
+    : left(left_), top(top_), right(right_), bottom(bottom_)
+{}
+
+bool operator==(const Rect& a, const Rect& b)
+{
+    if (&a == &b)
+        return true;
+    return fuzzyEqual(a.left, b.left) && fuzzyEqual(a.top, b.top) && fuzzyEqual(a.right, b.right) &&
+           fuzzyEqual(a.bottom, b.bottom);
+}
+
+} // namespace Types
