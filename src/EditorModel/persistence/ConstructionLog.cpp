@@ -1,0 +1,60 @@
+// SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/persistence/ConstructionLog.h>
+
+#include <EditorModel/persistence/Type.h>
+
+#include <algorithm>
+#include <utility>
+
+namespace Serialize::Details {
+namespace {
+
+thread_local ConstructionLog* current = nullptr;
+
+} // namespace
+
+ConstructionLog::ConstructionLog() : m_outer(std::exchange(current, this)) {}
+
+ConstructionLog::~ConstructionLog()
+{
+    current = m_outer;
+    destroyAll(m_made);
+}
+
+void* ConstructionLog::make(const Type& type)
+{
+    if (!current)
+        return type.create();
+    current->m_made.push_back({nullptr, &type});
+    return current->m_made.back().object = type.create();
+}
+
+void ConstructionLog::release(void* object)
+{
+    if (!current)
+        return;
+    // What is released was made a moment ago.
+    auto& made = current->m_made;
+    const auto found =
+        std::find_if(made.rbegin(), made.rend(), [object](const Made& entry) { return entry.object == object; });
+    if (found != made.rend())
+        found->object = nullptr;
+}
+
+std::vector<ConstructionLog::Made> ConstructionLog::take()
+{
+    auto made = std::exchange(m_made, {});
+    made.erase(std::remove_if(made.begin(), made.end(), [](const Made& entry) { return !entry.object; }), made.end());
+    return made;
+}
+
+void destroyAll(std::vector<ConstructionLog::Made>& made) noexcept
+{
+    for (auto entry = made.rbegin(); entry != made.rend(); ++entry) {
+        if (entry->object)
+            entry->type->destroy(entry->object);
+    }
+    made.clear();
+}
+
+} // namespace Serialize::Details

@@ -1,0 +1,218 @@
+// SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/persistence/Fields.h>
+
+#include <EditorModel/persistence/BoostArchives.h>
+#include <EditorModel/persistence/FailurePlace.h>
+
+#include <cstring>
+#include <stdexcept>
+#include <typeindex>
+#include <unordered_map>
+
+namespace Serialize {
+namespace Details {
+namespace {
+
+thread_local std::string failurePlace;
+thread_local int depth = 0;
+
+struct DepthGuard
+{
+    DepthGuard()
+    {
+        if (++depth > maxDepth) {
+            --depth;
+            throw std::runtime_error("objects nest deeper than " + std::to_string(maxDepth) + " levels");
+        }
+    }
+    ~DepthGuard() { --depth; }
+};
+
+/// Runs `body`; an exception on its way out is noted with the key, or with the number of the item.
+template <class Body>
+void placed(const Key& key, int item, Body body)
+{
+    try {
+        body();
+    } catch (...) {
+        const bool isItem = std::strcmp(key.stream, itemKey.stream) == 0;
+        FailurePlace::add(key.archive, isItem ? item : 0);
+        throw;
+    }
+}
+
+/// Entered classes, by what they are looked up by. Never destroyed, as static destructors may still save.
+struct Classes
+{
+    std::unordered_map<std::type_index, const Type*> byInfo;
+    std::unordered_map<std::string, const Type*> byName;
+};
+
+Classes& classes()
+{
+    static Classes* const instance = new Classes;
+    return *instance;
+}
+
+} // namespace
+
+void FailurePlace::clear()
+{
+    failurePlace.clear();
+}
+
+void FailurePlace::add(const char* key, int item)
+{
+    std::string step = item > 0 ? "[" + std::to_string(item) + "]" : std::string(key);
+    if (!failurePlace.empty() && failurePlace.front() != '[')
+        step += '/';
+    failurePlace.insert(0, step);
+}
+
+const std::string& FailurePlace::text()
+{
+    return failurePlace;
+}
+
+TypeEntry::TypeEntry(const Type& type)
+{
+    classes().byInfo.emplace(type.info, &type);
+    if (type.exported)
+        classes().byName.emplace(type.name, &type);
+    enterForms(type);
+}
+
+Pointee pointee(const void* object, const std::type_info& info, const Type* guess)
+{
+    return Pointee{const_cast<void*>(object), findType(info, guess)};
+}
+
+void visit(Fields& fields, const Type& type, void* object)
+{
+    if (depth == 0)
+        FailurePlace::clear();
+    const DepthGuard guard;
+    type.visit(fields, object);
+}
+
+void throwRepeatedKey()
+{
+    throw std::runtime_error("the key of a map stands twice");
+}
+
+void visitTexts(Fields& fields, QMap<QString, QString>& texts)
+{
+    const int count = fields.beginSequence(QtCollection, texts.size());
+    const QMap<QString, QString> stored = fields.loading() ? QMap<QString, QString>() : texts;
+    if (fields.loading())
+        texts.clear();
+    auto position = stored.begin();
+    for (int index = 1; index <= count; ++index) {
+        std::pair<const QString, QString> item;
+        if (!fields.loading()) {
+            const_cast<QString&>(item.first) = position.key();
+            item.second = position.value();
+            ++position;
+        }
+        using Entry = std::pair<const QString, QString>;
+        static const Type entry{typeid(Entry), nullptr, false, 0,
+                                [](Fields& f, void* pair) {
+                                    auto& text = *static_cast<Entry*>(pair);
+                                    f({"first", "Key"}, const_cast<QString&>(text.first));
+                                    f({"second", "Value"}, text.second);
+                                },
+                                nullptr, nullptr, nullptr};
+        fields.beginItem(index);
+        fields.entry(entry, &item);
+        fields.endItem(index);
+        if (fields.loading()) {
+            if (texts.contains(item.first))
+                throwRepeatedKey();
+            texts.insert(item.first, item.second);
+        }
+    }
+    fields.endSequence(count);
+}
+
+} // namespace Details
+
+const Type* findType(const std::type_info& info, const Type* guess)
+{
+    if (guess && guess->info == info)
+        return guess;
+    const auto found = Details::classes().byInfo.find(info);
+    return found == Details::classes().byInfo.end() ? nullptr : found->second;
+}
+
+const Type* findType(const std::string& name)
+{
+    const auto found = Details::classes().byName.find(name);
+    return found == Details::classes().byName.end() ? nullptr : found->second;
+}
+
+Fields::~Fields() = default;
+
+void Fields::scalar(const Key& key, const Scalar& value, const void* address)
+{
+    Details::placed(key, m_item, [&] { onScalar(key, value, address); });
+}
+
+void Fields::object(const Key& key, const Type& type, void* object)
+{
+    Details::placed(key, m_item, [&] { onObject(key, type, object); });
+}
+
+void Fields::baseFields(const char* key, const Type& type, void* object)
+{
+    Details::placed(key, m_item, [&] { onBase(Key(key, "BaseOfObject"), type, object); });
+}
+
+void Fields::pointer(const Key& key, const PointerField& field)
+{
+    Details::placed(key, m_item, [&] { onPointer(key, field); });
+}
+
+void Fields::container(const Key& key, const Type& type, void* container)
+{
+    const int item = std::exchange(m_item, 0);
+    Details::placed(key, item, [&] { onContainer(key, type, container); });
+    m_item = item;
+}
+
+int Fields::beginSequence(SequenceKind kind, int count)
+{
+    return onBeginSequence(kind, count);
+}
+
+void Fields::beginItem(int index)
+{
+    m_item = index;
+    onBeginItem(index);
+}
+
+void Fields::endItem(int index)
+{
+    onEndItem(index);
+}
+
+void Fields::endSequence(int count)
+{
+    onEndSequence(count);
+}
+
+void Fields::entry(const Type& pair, void* entry)
+{
+    Details::placed(Details::itemKey, m_item, [&] { onEntry(pair, entry); });
+}
+
+void Fields::binary(QByteArray& bytes, int size)
+{
+    onBinary(bytes, size);
+}
+
+std::shared_ptr<const Types::Image> Fields::share(const Types::Image* image)
+{
+    return onShare(image);
+}
+
+} // namespace Serialize

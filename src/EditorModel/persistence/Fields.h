@@ -1,0 +1,450 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include <EditorModel/persistence/Type.h>
+#include <EditorModel/types/MTime.h>
+
+#include <QByteArray>
+#include <QList>
+#include <QMap>
+#include <QPointF>
+#include <QString>
+
+#include <deque>
+#include <map>
+#include <memory>
+#include <set>
+#include <string>
+#include <tuple>
+#include <utility>
+#include <variant>
+
+class QPixmap;
+
+namespace Types {
+class Image;
+}
+
+namespace Serialize {
+
+/// The key of a field: in the archives, and in the field stream where it has another name there.
+struct Key
+{
+    const char* archive;
+    const char* stream;
+
+    constexpr Key(const char* both) : archive(both), stream(both) {}
+    constexpr Key(const char* inArchive, const char* inStream) : archive(inArchive), stream(inStream) {}
+};
+
+/// A value that has no fields of its own, by address. Enumerations go as `int`.
+using Scalar = std::variant<bool*, int*, quint32*, qint64*, double*, std::string*, QString*, MTime*, QPointF*,
+                            std::shared_ptr<const Types::Image>*>;
+
+/// What a pointer names: the complete object, with its type where that is registered.
+struct Pointee
+{
+    void* object;
+    const Type* type;
+};
+
+/// A field that points at a persistent object, or, with no root, at a picture.
+struct PointerField
+{
+    /// The class that the field is declared with; null for an abstract one.
+    const Type* declared;
+    void* slot;
+    /// The object is null for a null pointer, its type for a class that is not registered.
+    Pointee (*get)(const PointerField& field);
+    /// The pointer as it goes through the field stream.
+    const ISerializable* (*root)(const PointerField& field);
+    /// Null is stored as it is. An object of another class than the field's throws `std::bad_cast`, or, where
+    /// the field is `soft`, stores null.
+    /// `object` is the complete object and `root` its persistent root, which a picture has not.
+    void (*set)(const PointerField& field, void* object, ISerializable* root);
+    bool soft;
+};
+
+/// How the items of a sequence are introduced in the archives.
+enum SequenceKind : int
+{
+    Collection,   ///< a standard container: "count" and "item_version"
+    QtCollection, ///< a Qt container: "count" as `int`
+    Group,        ///< a pair or a tuple: nothing
+};
+
+/// The visitor of field lists. A class tells its fields once, in archive order; what a visitor does with them,
+/// write, read or check, is its own affair. Any exception that leaves a field is noted with the field's key.
+class EDITORMODEL_EXPORT Fields
+{
+public:
+    /// True if the visitor stores into the fields.
+    bool loading() const { return m_loading; }
+
+    /// A field. Pointers are nullable and read strictly: an object of another class throws `std::bad_cast`.
+    template <class T>
+    Fields& operator()(const Key& key, T& value);
+
+    /// A pointer that reads as null where the object is of another class.
+    template <class T>
+    Fields& soft(const Key& key, T*& pointer);
+
+    /// The field list of a persistent base, under `key` in the archives and "BaseOfObject" in the stream.
+    template <class Base, class Derived>
+    Fields& base(const char* key, Derived& object);
+
+    /// A value that is stored in another form: `encode` gives what is written for `value`, `decode` what is
+    /// kept of what was read.
+    template <class T, class Encode, class Decode>
+    Fields& coded(const Key& key, T& value, Encode encode, Decode decode);
+
+    void scalar(const Key& key, const Scalar& value, const void* address);
+    void object(const Key& key, const Type& type, void* object);
+    void pointer(const Key& key, const PointerField& field);
+    void container(const Key& key, const Type& type, void* container);
+
+    /// The items of a container stand between `beginSequence` and `endSequence`. `count` is what is written; the
+    /// result is the number of items to visit.
+    int beginSequence(SequenceKind kind, int count);
+    void beginItem(int index);
+    void endItem(int index);
+    void endSequence(int count);
+    /// The key and value of a map's item.
+    void entry(const Type& pair, void* entry);
+
+    /// `size` bytes with no key of their own; a reader has resized `bytes` to nothing before.
+    void binary(QByteArray& bytes, int size);
+    /// The one owner of a picture that was read through a pointer.
+    std::shared_ptr<const Types::Image> share(const Types::Image* image);
+
+protected:
+    explicit Fields(bool loading) : m_loading(loading) {}
+    virtual ~Fields();
+    Fields(const Fields&) = delete;
+    Fields& operator=(const Fields&) = delete;
+
+private:
+    virtual void onScalar(const Key& key, const Scalar& value, const void* address) = 0;
+    virtual void onObject(const Key& key, const Type& type, void* object) = 0;
+    virtual void onBase(const Key& key, const Type& type, void* object) = 0;
+    virtual void onPointer(const Key& key, const PointerField& field) = 0;
+    virtual void onContainer(const Key& key, const Type& type, void* container) = 0;
+    virtual int onBeginSequence(SequenceKind kind, int count) = 0;
+    virtual void onBeginItem(int index) = 0;
+    virtual void onEndItem(int index) = 0;
+    virtual void onEndSequence(int count) = 0;
+    virtual void onEntry(const Type& pair, void* entry) = 0;
+    virtual void onBinary(QByteArray& bytes, int size) = 0;
+    virtual std::shared_ptr<const Types::Image> onShare(const Types::Image* image) = 0;
+
+    void baseFields(const char* key, const Type& type, void* object);
+
+    const bool m_loading;
+    int m_item = 0;
+};
+
+namespace Details {
+
+/// What the complete object at `object` is; `guess` is the type that it most likely has.
+EDITORMODEL_EXPORT Pointee pointee(const void* object, const std::type_info& info, const Type* guess);
+
+/// Runs a field list, guarding the depth to which lists may nest.
+EDITORMODEL_EXPORT void visit(Fields& fields, const Type& type, void* object);
+
+[[noreturn]] EDITORMODEL_EXPORT void throwRepeatedKey();
+
+/// Objects nested deeper than this, by value or through pointers, are refused on saving and loading alike: each
+/// level takes stack.
+constexpr int maxDepth = 1000;
+
+template <class T, class = void>
+struct FieldOf;
+
+template <class T>
+using ScalarField = std::enable_if_t<std::is_constructible_v<Scalar, std::in_place_type_t<T*>, T*>>;
+
+template <class T>
+struct FieldOf<T, ScalarField<T>>
+{
+    static void visit(Fields& fields, const Key& key, T& value) { fields.scalar(key, Scalar(&value), &value); }
+};
+
+template <class T>
+struct FieldOf<T, std::enable_if_t<std::is_enum_v<T>>>
+{
+    static_assert(std::is_same_v<std::underlying_type_t<T>, int>, "enumerations are stored as int");
+    static void visit(Fields& fields, const Key& key, T& value)
+    {
+        int number = value;
+        fields.scalar(key, Scalar(&number), &value);
+        if (fields.loading())
+            value = static_cast<T>(number);
+    }
+};
+
+template <class T>
+struct FieldOf<T, std::enable_if_t<isPersistent<T>>>
+{
+    static void visit(Fields& fields, const Key& key, T& value)
+    {
+        fields.object(key, T::persistentType(), &value);
+    }
+};
+
+template <class T>
+PointerField pointerField(T*& slot, bool soft)
+{
+    using Class = std::remove_cv_t<T>;
+    const Type* declared = nullptr;
+    if constexpr (isPersistent<Class> && !std::is_abstract_v<Class>)
+        declared = &Class::persistentType();
+    return PointerField{
+        declared, const_cast<Class**>(&slot),
+        [](const PointerField& field) {
+            const Class* const object = *static_cast<Class**>(field.slot);
+            return object ? pointee(dynamic_cast<const void*>(object), typeid(*object), field.declared)
+                          : Pointee{nullptr, nullptr};
+        },
+        [](const PointerField& field) -> const ISerializable* { return *static_cast<Class**>(field.slot); },
+        [](const PointerField& field, void*, ISerializable* root) {
+            Class*& target = *static_cast<Class**>(field.slot);
+            target = dynamic_cast<Class*>(root);
+            if (root && !target && !field.soft)
+                throw std::bad_cast();
+        },
+        soft};
+}
+
+template <class T>
+struct FieldOf<T*>
+{
+    static_assert(std::is_base_of_v<ISerializable, std::remove_cv_t<T>>, "pointers go to persistent objects");
+    static void visit(Fields& fields, const Key& key, T*& pointer)
+    {
+        fields.pointer(key, pointerField(pointer, false));
+    }
+};
+
+/// The type constant of a container, whose field list is `visitItems`.
+template <class C>
+void visitItems(Fields& fields, void* container);
+
+template <class C>
+const Type& containerType()
+{
+    static const Type type{typeid(C), nullptr, false, 0, &visitItems<C>, nullptr, nullptr, nullptr};
+    return type;
+}
+
+constexpr Key itemKey{"item", "Data"};
+
+/// Items that a reader appends and fills where they stand: an archive may note their addresses.
+template <class C>
+void visitSequence(Fields& fields, C& container, SequenceKind kind)
+{
+    const int count = fields.beginSequence(kind, static_cast<int>(container.size()));
+    if (fields.loading())
+        container.clear();
+    auto position = container.begin();
+    for (int index = 1; index <= count; ++index) {
+        fields.beginItem(index);
+        if (fields.loading()) {
+            container.push_back({});
+            fields(itemKey, container.back());
+        } else {
+            fields(itemKey, *position++);
+        }
+        fields.endItem(index);
+    }
+    fields.endSequence(count);
+}
+
+template <class T>
+struct ItemsOf;
+
+template <class T>
+struct ItemsOf<std::deque<T>>
+{
+    static void visit(Fields& fields, std::deque<T>& items) { visitSequence(fields, items, Collection); }
+};
+
+template <class T>
+struct ItemsOf<QList<T>>
+{
+    static_assert(std::is_pointer_v<T>, "a QList moves what it holds by value");
+    static void visit(Fields& fields, QList<T>& items) { visitSequence(fields, items, QtCollection); }
+};
+
+template <class T, class Less>
+struct ItemsOf<std::set<T, Less>>
+{
+    static_assert(!isPersistent<T>, "an object that is read and then moved loses its identity");
+    static void visit(Fields& fields, std::set<T, Less>& items)
+    {
+        const int count = fields.beginSequence(Collection, static_cast<int>(items.size()));
+        if (fields.loading())
+            items.clear();
+        auto position = items.begin();
+        for (int index = 1; index <= count; ++index) {
+            fields.beginItem(index);
+            if (fields.loading()) {
+                T item{};
+                fields(itemKey, item);
+                items.insert(std::move(item));
+            } else {
+                fields(itemKey, const_cast<T&>(*position++));
+            }
+            fields.endItem(index);
+        }
+        fields.endSequence(count);
+    }
+};
+
+/// The entry of a map while it is read: its key first, and then the value at its place in the map.
+template <class Map>
+struct MapEntry
+{
+    using Pair = typename Map::value_type;
+
+    Map* map;
+    Pair* pair;
+
+    static void visit(Fields& fields, void* object)
+    {
+        auto& entry = *static_cast<MapEntry*>(object);
+        if (!fields.loading()) {
+            fields({"first", "Key"}, const_cast<typename Map::key_type&>(entry.pair->first));
+            fields({"second", "Value"}, entry.pair->second);
+            return;
+        }
+        typename Map::key_type key{};
+        fields({"first", "Key"}, key);
+        const auto place = entry.map->try_emplace(std::move(key));
+        if (!place.second)
+            throwRepeatedKey();
+        fields({"second", "Value"}, place.first->second);
+    }
+
+    static const Type& type()
+    {
+        static const Type type{typeid(Pair), nullptr, false, 0, &visit, nullptr, nullptr, nullptr};
+        return type;
+    }
+};
+
+template <class K, class V, class Less>
+struct ItemsOf<std::map<K, V, Less>>
+{
+    using Map = std::map<K, V, Less>;
+
+    static void visit(Fields& fields, Map& map)
+    {
+        const int count = fields.beginSequence(Collection, static_cast<int>(map.size()));
+        if (fields.loading())
+            map.clear();
+        auto position = map.begin();
+        for (int index = 1; index <= count; ++index) {
+            fields.beginItem(index);
+            MapEntry<Map> entry{&map, fields.loading() ? nullptr : &*position++};
+            fields.entry(MapEntry<Map>::type(), &entry);
+            fields.endItem(index);
+        }
+        fields.endSequence(count);
+    }
+};
+
+template <class First, class Second>
+struct ItemsOf<std::pair<First, Second>>
+{
+    static void visit(Fields& fields, std::pair<First, Second>& pair)
+    {
+        fields.beginSequence(Group, 1);
+        fields.beginItem(1);
+        fields({"first", "First"}, const_cast<std::remove_const_t<First>&>(pair.first));
+        fields({"second", "Second"}, pair.second);
+        fields.endItem(1);
+        fields.endSequence(1);
+    }
+};
+
+template <class... Elements>
+struct ItemsOf<std::tuple<Elements...>>
+{
+    static void visit(Fields& fields, std::tuple<Elements...>& tuple)
+    {
+        constexpr int count = sizeof...(Elements);
+        fields.beginSequence(Group, count);
+        int index = 0;
+        const auto element = [&](auto& value) {
+            fields.beginItem(++index);
+            fields(Key{"element", "Data"}, value);
+            fields.endItem(index);
+        };
+        std::apply([&](auto&... values) { (element(values), ...); }, tuple);
+        fields.endSequence(count);
+    }
+};
+
+/// QMap<QString, QString>, item by item through a pair.
+EDITORMODEL_EXPORT void visitTexts(Fields& fields, QMap<QString, QString>& texts);
+
+template <>
+struct ItemsOf<QMap<QString, QString>>
+{
+    static void visit(Fields& fields, QMap<QString, QString>& texts) { visitTexts(fields, texts); }
+};
+
+template <class C>
+void visitItems(Fields& fields, void* container)
+{
+    ItemsOf<C>::visit(fields, *static_cast<C*>(container));
+}
+
+template <class C>
+struct FieldOf<C, std::void_t<decltype(&ItemsOf<C>::visit)>>
+{
+    static void visit(Fields& fields, const Key& key, C& container)
+    {
+        fields.container(key, containerType<C>(), &container);
+    }
+};
+
+} // namespace Details
+
+template <class T>
+Fields& Fields::operator()(const Key& key, T& value)
+{
+    Details::FieldOf<T>::visit(*this, key, value);
+    return *this;
+}
+
+template <class T>
+Fields& Fields::soft(const Key& key, T*& value)
+{
+    pointer(key, Details::pointerField(value, true));
+    return *this;
+}
+
+template <class Base, class Derived>
+Fields& Fields::base(const char* key, Derived& object)
+{
+    baseFields(key, Base::persistentType(), static_cast<Base*>(&object));
+    return *this;
+}
+
+template <class T, class Encode, class Decode>
+Fields& Fields::coded(const Key& key, T& value, Encode encode, Decode decode)
+{
+    // The stored form lives only here; a null address keeps it out of what is known by address.
+    auto stored = encode(value);
+    scalar(key, Scalar(&stored), nullptr);
+    if (loading())
+        value = decode(stored);
+    return *this;
+}
+
+} // namespace Serialize
+
+EDITORMODEL_ARCHIVE_NAME(QByteArray, "QByteArray")
+EDITORMODEL_ARCHIVE_NAME(QPixmap, "QPixmap")
+EDITORMODEL_ARCHIVE_NAME(Types::Image, "Types::Image")

@@ -1,0 +1,154 @@
+// SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/persistence/Pictures.h>
+
+#include <EditorModel/persistence/Fields.h>
+#include <EditorModel/types/Image.h>
+
+#include <QBuffer>
+#include <QGuiApplication>
+#include <QImageReader>
+
+#include <stdexcept>
+
+namespace Serialize::Details {
+namespace {
+
+/// The largest picture that is read: 16384 by 16384.
+constexpr qint64 maxPixels = qint64(1) << 28;
+
+void visitBytes(Fields& fields, void* object)
+{
+    auto& bytes = *static_cast<QByteArray*>(object);
+    int size = bytes.size();
+    fields("size", size);
+    if (size < 0)
+        throw std::runtime_error("a size of " + std::to_string(size) + " bytes");
+    fields.binary(bytes, size);
+}
+
+const Type& bytesType()
+{
+    static const Type type{typeid(QByteArray), boost::serialization::guid<QByteArray>(), true, 0, &visitBytes,
+                           nullptr,            nullptr,                                  nullptr};
+    return type;
+}
+
+void visitPixmap(Fields& fields, void* object)
+{
+    auto& pixmap = *static_cast<QPixmap*>(object);
+    QByteArray png;
+    if (!fields.loading())
+        png = pngOf(pixmap);
+    fields.object("png", bytesType(), &png);
+    if (fields.loading())
+        pixmap = pixmapOfPng(png);
+}
+
+const Type& pixmapType()
+{
+    static const Type type{typeid(QPixmap), boost::serialization::guid<QPixmap>(), true, 0, &visitPixmap,
+                           nullptr,         nullptr,                               nullptr};
+    return type;
+}
+
+void visitPicture(Fields& fields, void* object)
+{
+    fields.object("image", pixmapType(), static_cast<QPixmap*>(static_cast<Types::Image*>(object)));
+}
+
+void* createPicture()
+{
+    requirePictures();
+    return new Types::Image;
+}
+
+void destroyPicture(void* object)
+{
+    delete static_cast<Types::Image*>(object);
+}
+
+void visitShared(Fields& fields, void* object)
+{
+    auto& shared = *static_cast<std::shared_ptr<const Types::Image>*>(object);
+    auto* picture = const_cast<Types::Image*>(shared.get());
+    const PointerField field{
+        &pictureType(),
+        &picture,
+        [](const PointerField& slot) { return Pointee{*static_cast<Types::Image**>(slot.slot), &pictureType()}; },
+        [](const PointerField&) -> const ISerializable* { return nullptr; },
+        [](const PointerField& slot, void* read, ISerializable* root) {
+            if (root)
+                throw std::bad_cast();
+            *static_cast<Types::Image**>(slot.slot) = static_cast<Types::Image*>(read);
+        },
+        false};
+    fields.pointer("px", field);
+    if (fields.loading())
+        shared = picture ? fields.share(picture) : nullptr;
+}
+
+} // namespace
+
+const Type& pictureType()
+{
+    static const Type type{typeid(Types::Image), boost::serialization::guid<Types::Image>(),
+                           true,                 0,
+                           &visitPicture,        &createPicture,
+                           &destroyPicture,      nullptr};
+    static const TypeEntry entry(type);
+    return type;
+}
+
+const Type& sharedPictureType()
+{
+    static const Type type{typeid(std::shared_ptr<const Types::Image>),
+                           nullptr,
+                           false,
+                           1,
+                           &visitShared,
+                           nullptr,
+                           nullptr,
+                           nullptr};
+    return type;
+}
+
+QByteArray pngOf(const QPixmap& pixmap)
+{
+    QByteArray png;
+    QBuffer buffer(&png);
+    buffer.open(QIODevice::WriteOnly);
+    // A null pixmap has no PNG form: it is stored as no bytes.
+    if (!pixmap.isNull() && !pixmap.save(&buffer, "PNG", -1))
+        throw std::runtime_error("a picture cannot be written as PNG");
+    return png;
+}
+
+QPixmap pixmapOfPng(const QByteArray& png)
+{
+    requirePictures();
+    if (png.isEmpty())
+        return QPixmap();
+    QBuffer buffer;
+    buffer.setData(png);
+    QImageReader reader(&buffer);
+    const QSize size = reader.size();
+    if (!size.isValid())
+        throw std::runtime_error("the data of a picture is no picture");
+    // Deflate packs at most 1032 bytes into one, and a byte holds at most eight pixels.
+    const qint64 pixels = qint64(size.width()) * size.height();
+    if (pixels > qint64(png.size()) * 1032 * 8 || pixels > maxPixels)
+        throw std::runtime_error("a picture claims to be " + std::to_string(size.width()) + " by " +
+                                 std::to_string(size.height()) + " pixels, more than its data can hold");
+    const QPixmap pixmap = QPixmap::fromImageReader(&reader);
+    if (pixmap.isNull())
+        throw std::runtime_error("the data of a picture is no picture");
+    return pixmap;
+}
+
+void requirePictures()
+{
+    if (!qobject_cast<QGuiApplication*>(QCoreApplication::instance()))
+        throw std::runtime_error("a picture needs a QGuiApplication");
+}
+
+} // namespace Serialize::Details
