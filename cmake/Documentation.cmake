@@ -1,0 +1,11 @@
+# SPDX-License-Identifier: Apache-2.0
+# The target `docs`: the interface's reference pages, where Doxygen is installed.
+
+find_package(Doxygen QUIET)
+if(DOXYGEN_FOUND)
+    configure_file(docs/Doxyfile.in Doxyfile @ONLY)
+    add_custom_target(docs
+        COMMAND Doxygen::doxygen "${CMAKE_CURRENT_BINARY_DIR}/Doxyfile"
+        COMMENT "Writing the reference pages to ${CMAKE_CURRENT_BINARY_DIR}/docs/html"
+        VERBATIM)
+endif()
