@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/AvTime.h>
 
+#include "tests/types/Printing.h"
+
 #include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>
-
-#include "tests/types/Printing.h"
 
 namespace {
 

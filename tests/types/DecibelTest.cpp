@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Decibel.h>
 
-#include <cmath>
-#include <limits>
-#include <type_traits>
+#include "tests/types/Printing.h"
 
 #include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>
 
-#include "tests/types/Printing.h"
+#include <cmath>
+#include <limits>
+#include <type_traits>
 
 namespace {
 

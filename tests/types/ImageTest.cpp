@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Image.h>
 
-#include <memory>
-
 #include <QColor>
 #include <QGuiApplication>
 #include <QImage>
 
 #include <gtest/gtest.h>
+
+#include <memory>
 
 namespace {
 

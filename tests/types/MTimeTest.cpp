@@ -1,17 +1,17 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/MTime.h>
 
+#include "tests/types/Printing.h"
+
+#include <gtest/gtest.h>
+#include <rapidcheck/gtest.h>
+
 #include <algorithm>
 #include <chrono>
 #include <cmath>
 #include <limits>
 #include <type_traits>
 #include <unordered_set>
-
-#include <gtest/gtest.h>
-#include <rapidcheck/gtest.h>
-
-#include "tests/types/Printing.h"
 
 namespace {
 

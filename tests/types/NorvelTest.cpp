@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Norvel.h>
 
+#include <gtest/gtest.h>
+
 #include <limits>
 #include <type_traits>
-
-#include <gtest/gtest.h>
 
 namespace {
 

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <ostream>
-
 #include <EditorModel/types/Decibel.h>
 #include <EditorModel/types/MTime.h>
 #include <EditorModel/types/Range.h>
+
+#include <ostream>
 
 // How the values look in the messages of failed tests. Both test libraries look for operators.
 

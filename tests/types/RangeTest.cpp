@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Range.h>
 
-#include <set>
-#include <type_traits>
-#include <vector>
+#include "tests/types/Printing.h"
 
 #include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>
 
-#include "tests/types/Printing.h"
+#include <set>
+#include <type_traits>
+#include <vector>
 
 namespace {
 

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Rect.h>
 
+#include <gtest/gtest.h>
+
 #include <array>
 #include <limits>
-
-#include <gtest/gtest.h>
 
 namespace {
 

@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Transform.h>
 
-#include <array>
+#include <EditorModel/types/Norvel.h>
 
 #include <QTransform>
 
 #include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>
 
-#include <EditorModel/types/Norvel.h>
+#include <array>
 
 namespace {
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <QtGlobal>
-
 #include <EditorModel/types/MTime.h>
+
+#include <QtGlobal>
 
 /// Conversions between MTime and the media engine's AvTime, a signed 64-bit count of microseconds.
 namespace Types {

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Decibel.h>
 
-#include <cmath>
-
 #include <EditorModel/types/FuzzyCompare.h>
+
+#include <cmath>
 
 Decibel Decibel::fromRelativeLevel(double relative)
 {

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <QPixmap>
-
 #include <EditorModel/Export.h>
 #include <EditorModel/bus/PubSub.h>
+
+#include <QPixmap>
 
 namespace Types {
 

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include <QtGlobal>
+
 #include <chrono>
 #include <functional>
 #include <limits>
 #include <type_traits>
-
-#include <QtGlobal>
 
 /// A point or a span of time in whole milliseconds. It may be negative. Sums and differences are plain signed
 /// 64-bit arithmetic: overflow is the caller's to avoid.

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Pen.h>
 
-#include <algorithm>
-#include <limits>
-
 #include <QBrush>
 #include <QColor>
 #include <QPen>
+
+#include <algorithm>
+#include <limits>
 
 namespace {
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <QtGlobal>
-
 #include <EditorModel/Export.h>
+
+#include <QtGlobal>
 
 class QPen;
 

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <set>
-
 #include <EditorModel/Export.h>
 #include <EditorModel/types/MTime.h>
+
+#include <set>
 
 namespace Types {
 

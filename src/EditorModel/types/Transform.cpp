@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Transform.h>
 
-#include <QTransform>
-
 #include <EditorModel/types/Norvel.h>
+
+#include <QTransform>
 
 namespace Types {
 

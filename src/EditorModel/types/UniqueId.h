@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <QString>
-
 #include <EditorModel/Export.h>
+
+#include <QString>
 
 namespace Types {
 
