@@ -57,4 +57,12 @@ TEST(ApplicationObjects, SendMessages)
     hearsOnlyTheObjectSubscribedTo(Statistics::globalObject());
 }
 
+TEST(ApplicationObjects, WriteStatisticsUnderANameThatMakesNothing)
+{
+    const Serialize::ISerializable* statistics = Statistics::globalObject();
+    EXPECT_EQ("Statistics::Object", statistics->GetNameInArchive());
+    EXPECT_STREQ("Statistics::Object", Statistics::Object::NameInArchive());
+    EXPECT_EQ(nullptr, Serialize::findCreator("Statistics::Object"));
+}
+
 } // namespace

@@ -3,12 +3,16 @@
 
 #include <EditorModel/Export.h>
 #include <EditorModel/bus/PubSub.h>
+#include <EditorModel/persistence/Persistent.h>
 
 namespace Statistics {
 
-/// The sender of messages about the usage statistics. It holds nothing: its identity is its use.
-class EDITORMODEL_EXPORT Object : public virtual PubSub::Object
+/// The sender of messages about the usage statistics. It holds nothing: its identity is its use. It can be
+/// written, without fields, but isn't made by name.
+class EDITORMODEL_EXPORT Object : public Serialize::ISerializable, public virtual PubSub::Object
 {
+    EDITORMODEL_PERSISTENT_UNREGISTERED(Object)
+
 public:
     ~Object() override;
 };

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Pen.h>
 
+#include <EditorModel/persistence/Fields.h>
+
 #include <QBrush>
 #include <QColor>
 #include <QPen>
@@ -45,4 +47,11 @@ QPen Pen::toQPen() const
     return QPen(brush, static_cast<double>(width), Qt::SolidLine, Qt::SquareCap, Qt::BevelJoin);
 }
 
+void fields(Serialize::Fields& f, Pen& pen)
+{
+    f("color", pen.color)("width", pen.width)("enabled", pen.enabled);
+}
+
 } // namespace Types
+
+EDITORMODEL_PERSISTENT_CLASS(Types::Pen)

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <EditorModel/Export.h>
+#include <EditorModel/persistence/Persistent.h>
 
 #include <QtGlobal>
 
@@ -10,8 +11,10 @@ class QPen;
 namespace Types {
 
 /// What the model keeps of a pen.
-class EDITORMODEL_EXPORT Pen
+class EDITORMODEL_EXPORT Pen : public Serialize::ISerializable
 {
+    EDITORMODEL_PERSISTENT(Pen)
+
 public:
     /// ARGB, opaque black by default.
     quint32 color = 0xFF000000;
@@ -38,3 +41,5 @@ public:
 };
 
 } // namespace Types
+
+EDITORMODEL_ARCHIVE_NAME(Types::Pen, "Types::Pen")

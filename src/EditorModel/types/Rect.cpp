@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Rect.h>
 
+#include <EditorModel/persistence/Fields.h>
 #include <EditorModel/types/FuzzyCompare.h>
 
 namespace Types {
@@ -19,4 +20,11 @@ bool operator==(const Rect& a, const Rect& b)
            fuzzyEqual(a.bottom, b.bottom);
 }
 
+void fields(Serialize::Fields& f, Rect& rect)
+{
+    f("top", rect.top)("left", rect.left)("bottom", rect.bottom)("right", rect.right);
+}
+
 } // namespace Types
+
+EDITORMODEL_PERSISTENT_CLASS(Types::Rect)

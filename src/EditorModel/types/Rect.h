@@ -2,12 +2,15 @@
 #pragma once
 
 #include <EditorModel/Export.h>
+#include <EditorModel/persistence/Persistent.h>
 
 namespace Types {
 
 /// A rectangle by its four edges.
-class EDITORMODEL_EXPORT Rect
+class EDITORMODEL_EXPORT Rect : public Serialize::ISerializable
 {
+    EDITORMODEL_PERSISTENT(Rect)
+
 public:
     double left = 0.0;
     double top = 0.0;
@@ -25,3 +28,5 @@ public:
 EDITORMODEL_EXPORT bool operator==(const Rect& a, const Rect& b);
 
 } // namespace Types
+
+EDITORMODEL_ARCHIVE_NAME(Types::Rect, "Types::Rect")

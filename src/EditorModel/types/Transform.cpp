@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/types/Transform.h>
 
+#include <EditorModel/persistence/Fields.h>
 #include <EditorModel/types/Norvel.h>
 
 #include <QTransform>
@@ -54,4 +55,13 @@ QTransform Transform::toQTransform() const
     return QTransform(m11, m12, m13, m21, m22, m23, m31, m32, m33);
 }
 
+void fields(Serialize::Fields& f, Transform& transform)
+{
+    f("m11", transform.m11)("m12", transform.m12)("m13", transform.m13);
+    f("m21", transform.m21)("m22", transform.m22)("m23", transform.m23);
+    f("m31", transform.m31)("m32", transform.m32)("m33", transform.m33);
+}
+
 } // namespace Types
+
+EDITORMODEL_PERSISTENT_CLASS(Types::Transform)

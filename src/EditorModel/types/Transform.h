@@ -2,6 +2,7 @@
 #pragma once
 
 #include <EditorModel/Export.h>
+#include <EditorModel/persistence/Persistent.h>
 
 class QTransform;
 
@@ -13,8 +14,10 @@ namespace Types {
 
 /// A 3x3 transform in row order with the names of QTransform: `m31` and `m32` are the translation. It has no
 /// equality; compare the fields.
-class EDITORMODEL_EXPORT Transform
+class EDITORMODEL_EXPORT Transform : public Serialize::ISerializable
 {
+    EDITORMODEL_PERSISTENT(Transform)
+
 public:
     double m11 = 1.0;
     double m12 = 0.0;
@@ -46,3 +49,5 @@ public:
 };
 
 } // namespace Types
+
+EDITORMODEL_ARCHIVE_NAME(Types::Transform, "Types::Transform")
