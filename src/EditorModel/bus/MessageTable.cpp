@@ -1,0 +1,118 @@
+// SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/bus/detail/MessageTable.h>
+
+#include <algorithm>
+
+namespace PubSub::Details {
+
+quint64 MessageTable::registerSubscriber(void* subscriber, const SubscriberBase& base)
+{
+    m_registrations.add(subscriber) = {++m_lastSerial, &base};
+    return m_lastSerial;
+}
+
+void MessageTable::unregisterSubscriber(const void* subscriber)
+{
+    m_registrations.remove(subscriber);
+    ++m_state.removals;
+}
+
+void MessageTable::subscribe(const Recipient& recipient, const Object* object)
+{
+    m_bySender.add(object).add(recipient);
+}
+
+void MessageTable::unsubscribe(const Recipient& recipient, const Object* object)
+{
+    ++m_state.removals;
+    RecipientList* recipients = m_bySender.find(object);
+    if (!recipients) {
+        return;
+    }
+    recipients->remove(recipient.subscriber);
+    if (recipients->isEmpty()) {
+        m_bySender.remove(object);
+    }
+}
+
+void MessageTable::subscribeAll(const Recipient& recipient, const std::type_index& objectType)
+{
+    all(objectType).add(recipient);
+}
+
+void MessageTable::unsubscribeAll(const Recipient& recipient, const std::type_index& objectType)
+{
+    ++m_state.removals;
+    all(objectType).remove(recipient.subscriber);
+}
+
+RecipientList& MessageTable::all(const std::type_index& objectType)
+{
+    for (const auto& [type, recipients] : m_byType) {
+        if (type == objectType) {
+            return *recipients;
+        }
+    }
+    return *m_byType.emplace_back(objectType, std::make_unique<RecipientList>()).second;
+}
+
+Snapshot MessageTable::snapshot(const Object* sender, const RecipientList& all)
+{
+    const RecipientList* some = m_bySender.find(sender);
+    if (some && !all.isEmpty()) {
+        return snapshotOfBoth(sender, *some, all);
+    }
+    const RecipientList& recipients = some ? *some : all;
+    const std::size_t count = recipients.size();
+    if (count == 0) {
+        return {nullptr, 0};
+    }
+    if (count > 1) {
+        push(recipients.begin(), recipients.end());
+    }
+    return {recipients.begin()->subscriber, count};
+}
+
+/// Somebody who is in both lists is reached once.
+Snapshot MessageTable::snapshotOfBoth(const Object* sender, const RecipientList& some,
+                                      const RecipientList& all)
+{
+    const std::size_t begin = m_state.used;
+    reserve(some.size() + all.size());
+    push(some.begin(), some.end());
+    for (const Recipient& recipient : all) {
+        if (!m_registrations.find(recipient.subscriber)->base->isSubscribed(sender)) {
+            m_state.snapshots[m_state.used++] = recipient;
+        }
+    }
+    const Snapshot result{m_state.snapshots[begin].subscriber, m_state.used - begin};
+    if (result.count == 1) {
+        m_state.used = begin;
+    }
+    return result;
+}
+
+void MessageTable::push(const Recipient* begin, const Recipient* end)
+{
+    reserve(static_cast<std::size_t>(end - begin));
+    std::copy(begin, end, m_state.snapshots + m_state.used);
+    m_state.used += static_cast<std::size_t>(end - begin);
+}
+
+void MessageTable::reserve(std::size_t count)
+{
+    if (m_state.used + count > m_arena.size()) {
+        m_arena.resize(std::max(m_state.used + count, m_arena.size() * 2));
+        m_state.snapshots = m_arena.data();
+    }
+}
+
+bool MessageTable::isDue(const Recipient& recipient, const Object* sender,
+                         const std::type_index& objectType) const
+{
+    const Registration* registration = m_registrations.find(recipient.subscriber);
+    return registration && registration->serial == recipient.registration &&
+           (registration->base->isSubscribed(objectType) || registration->base->isSubscribed(sender));
+}
+
+} // namespace PubSub::Details

@@ -1,0 +1,52 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include <EditorModel/bus/detail/RecipientList.h>
+
+#include <utility>
+#include <vector>
+
+namespace PubSub::Details {
+
+/// Who receives the messages of one type. Belongs to the thread that uses the message type.
+class MessageTable
+{
+public:
+    DeliveryState& state() { return m_state; }
+
+    /// Returns the serial number of the registration.
+    quint64 registerSubscriber(void* subscriber, const SubscriberBase& base);
+    /// The subscriber must have been left out of all lists before.
+    void unregisterSubscriber(const void* subscriber);
+
+    void subscribe(const Recipient& recipient, const Object* object);
+    void unsubscribe(const Recipient& recipient, const Object* object);
+    void subscribeAll(const Recipient& recipient, const std::type_index& objectType);
+    void unsubscribeAll(const Recipient& recipient, const std::type_index& objectType);
+
+    /// The recipients that subscribed to all objects of the type. Stays in place.
+    RecipientList& all(const std::type_index& objectType);
+
+    Snapshot snapshot(const Object* sender, const RecipientList& all);
+    bool isDue(const Recipient& recipient, const Object* sender, const std::type_index& objectType) const;
+
+private:
+    struct Registration
+    {
+        quint64 serial = 0;
+        const SubscriberBase* base = nullptr;
+    };
+
+    Snapshot snapshotOfBoth(const Object* sender, const RecipientList& some, const RecipientList& all);
+    void push(const Recipient* begin, const Recipient* end);
+    void reserve(std::size_t count);
+
+    DeliveryState m_state;
+    PointerMap<RecipientList> m_bySender;
+    std::vector<std::pair<std::type_index, std::unique_ptr<RecipientList>>> m_byType;
+    PointerMap<Registration> m_registrations;
+    quint64 m_lastSerial = 0;
+    std::vector<Recipient> m_arena;
+};
+
+} // namespace PubSub::Details
