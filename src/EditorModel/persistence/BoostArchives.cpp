@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-// The template route over Boost's binary and XML archives. What Boost's templates would generate for every class
-// and archive is made here at run time, from each class's Type, through the interfaces that Boost keeps for
-// authors of archives: the documents are those that stock templates would write.
+// The template route over Boost's binary and XML archives. What Boost's templates would generate for every
+// class and archive is made here at run time, from each class's Type, through the interfaces that Boost keeps
+// for authors of archives: the documents are those that stock templates would write.
 #include <EditorModel/persistence/BoostArchives.h>
 #include <EditorModel/persistence/ConstructionLog.h>
 #include <EditorModel/persistence/Fields.h>
@@ -29,8 +29,8 @@
 
 namespace Serialize::Details {
 
-/// One act on an archive that stands where Boost expects a value: a name-value pair around it brings the tags of
-/// the XML form, and the act does the rest.
+/// One act on an archive that stands where Boost expects a value: a name-value pair around it brings the tags
+/// of the XML form, and the act does the rest.
 template <class Act>
 struct Step
 {
@@ -95,7 +95,7 @@ public:
     {
         archiveFields(static_cast<Archive&>(archive), m_type, const_cast<void*>(object));
     }
-    bool class_info() const override { return true; }
+    bool class_info() const override { return m_type.classInfo; }
     bool tracking(const unsigned int) const override { return serialized_as_pointer(); }
     ba::version_type version() const override { return ba::version_type(m_type.version); }
     bool is_polymorphic() const override { return m_type.create != nullptr; }
@@ -108,7 +108,8 @@ template <class Archive>
 class PointerOutputForm final : public ba::detail::basic_pointer_oserializer
 {
 public:
-    PointerOutputForm(const TypeInfo& info, OutputForm<Archive>& form) : basic_pointer_oserializer(info), m_form(form)
+    PointerOutputForm(const TypeInfo& info, OutputForm<Archive>& form)
+        : basic_pointer_oserializer(info), m_form(form)
     {
         form.set_bpos(this);
         ba::detail::archive_serializer_map<Archive>::insert(this);
@@ -130,11 +131,12 @@ class InputForm final : public ba::detail::basic_iserializer
 public:
     InputForm(const TypeInfo& info, const Type& type) : basic_iserializer(info), m_type(type) {}
 
-    void load_object_data(ba::detail::basic_iarchive& archive, void* object, const unsigned int) const override
+    void load_object_data(ba::detail::basic_iarchive& archive, void* object,
+                          const unsigned int) const override
     {
         archiveFields(static_cast<Archive&>(archive), m_type, object);
     }
-    bool class_info() const override { return true; }
+    bool class_info() const override { return m_type.classInfo; }
     bool tracking(const unsigned int) const override { return serialized_as_pointer(); }
     ba::version_type version() const override { return ba::version_type(m_type.version); }
     bool is_polymorphic() const override { return m_type.create != nullptr; }
@@ -150,7 +152,8 @@ template <class Archive>
 class PointerInputForm final : public ba::detail::basic_pointer_iserializer
 {
 public:
-    PointerInputForm(const TypeInfo& info, InputForm<Archive>& form) : basic_pointer_iserializer(info), m_form(form)
+    PointerInputForm(const TypeInfo& info, InputForm<Archive>& form)
+        : basic_pointer_iserializer(info), m_form(form)
     {
         form.set_bpis(this);
         ba::detail::archive_serializer_map<Archive>::insert(this);
@@ -333,7 +336,10 @@ private:
             within(key.archive, [&](Archive&) { object_(type, object); });
     }
 
-    void onContainer(const Key& key, const Type& type, void* container) override { onObject(key, type, container); }
+    void onContainer(const Key& key, const Type& type, void* container) override
+    {
+        onObject(key, type, container);
+    }
     void onEntry(const Type& pair, void* entry) override { onObject(itemKey, pair, entry); }
 
     void onBeginItem(int) override {}
@@ -553,9 +559,10 @@ private:
                 field.set(field, nullptr, nullptr);
                 return;
             }
-            const Type* const type = findType(
-                static_cast<const bs::typeid_system::extended_type_info_typeid_0&>(found->get_eti()).get_typeid(),
-                field.declared);
+            const Type* const type =
+                findType(static_cast<const bs::typeid_system::extended_type_info_typeid_0&>(found->get_eti())
+                             .get_typeid(),
+                         field.declared);
             if (!type)
                 throwUnregistered();
             field.set(field, object, type->serializable ? type->serializable(object) : nullptr);

@@ -35,8 +35,8 @@ void ConstructionLog::release(void* object)
         return;
     // What is released was made a moment ago.
     auto& made = current->m_made;
-    const auto found =
-        std::find_if(made.rbegin(), made.rend(), [object](const Made& entry) { return entry.object == object; });
+    const auto found = std::find_if(made.rbegin(), made.rend(),
+                                    [object](const Made& entry) { return entry.object == object; });
     if (found != made.rend())
         found->object = nullptr;
 }
@@ -44,7 +44,8 @@ void ConstructionLog::release(void* object)
 std::vector<ConstructionLog::Made> ConstructionLog::take()
 {
     auto made = std::exchange(m_made, {});
-    made.erase(std::remove_if(made.begin(), made.end(), [](const Made& entry) { return !entry.object; }), made.end());
+    made.erase(std::remove_if(made.begin(), made.end(), [](const Made& entry) { return !entry.object; }),
+               made.end());
     return made;
 }
 

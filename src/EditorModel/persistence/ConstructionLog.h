@@ -10,8 +10,8 @@ struct Type;
 namespace Details {
 
 /// Owns every object that a load makes until the load has succeeded: archives themselves free only what they
-/// finished. The innermost log of a thread takes what is made on it; without one nothing is noted, and objects
-/// belong to whoever reads them.
+/// finished. The innermost log of a thread takes what is made on it; without one nothing is noted, and
+/// objects belong to whoever reads them.
 class ConstructionLog
 {
 public:

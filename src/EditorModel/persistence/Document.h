@@ -28,8 +28,8 @@ enum Form : int
 enum Route : int
 {
     /// Boost's archives and the Json archive. Times are cut to 32 bits of milliseconds. Its binary and XML
-    /// documents are guarded against damage, but are for files of one's own: whoever can write the guard as well
-    /// can harm a reader.
+    /// documents are guarded against damage, but are for files of one's own: whoever can write the guard as
+    /// well can harm a reader.
     Archive,
     /// The field stream. Times are whole, and documents of any origin can be read.
     Stream,
@@ -54,8 +54,8 @@ private:
     std::string m_reason;
 };
 
-/// Owns every object of a loaded document and frees each once, however many pointers lead to it. Pointers into
-/// the graph are valid as long as it lives.
+/// Owns every object of a loaded document and frees each once, however many pointers lead to it. Pointers
+/// into the graph are valid as long as it lives.
 class EDITORMODEL_EXPORT Graph
 {
 public:
@@ -89,10 +89,10 @@ private:
     std::vector<Owned> m_objects;
 };
 
-/// Writes the objects, and all that they point at, to an open device. Throws `Error`; the device may then hold a
-/// part of a document.
-EDITORMODEL_EXPORT void save(QIODevice& device, const std::deque<const Serialize::ISerializable*>& roots, Form form,
-                             Route route = Archive);
+/// Writes the objects, and all that they point at, to an open device. Throws `Error`; the device may then
+/// hold a part of a document.
+EDITORMODEL_EXPORT void save(QIODevice& device, const std::deque<const Serialize::ISerializable*>& roots,
+                             Form form, Route route = Archive);
 EDITORMODEL_EXPORT void save(QIODevice& device, const Serialize::ISerializable& root, Form form,
                              Route route = Archive);
 
@@ -101,8 +101,9 @@ EDITORMODEL_EXPORT void save(QIODevice& device, const Serialize::ISerializable& 
 EDITORMODEL_EXPORT Graph load(QIODevice& device);
 
 /// The same with files; a file is replaced as a whole or not at all. An error names the file as well.
-EDITORMODEL_EXPORT void saveFile(const QString& path, const std::deque<const Serialize::ISerializable*>& roots,
-                                 Form form, Route route = Archive);
+EDITORMODEL_EXPORT void saveFile(const QString& path,
+                                 const std::deque<const Serialize::ISerializable*>& roots, Form form,
+                                 Route route = Archive);
 EDITORMODEL_EXPORT Graph loadFile(const QString& path);
 
 /// By the ending of the name, in any case: .bin, .xml, .json; none for any other.

@@ -115,13 +115,11 @@ void visitTexts(Fields& fields, QMap<QString, QString>& texts)
             ++position;
         }
         using Entry = std::pair<const QString, QString>;
-        static const Type entry{typeid(Entry), nullptr, false, 0,
-                                [](Fields& f, void* pair) {
+        static const Type entry{typeid(Entry), [](Fields& f, void* pair) {
                                     auto& text = *static_cast<Entry*>(pair);
                                     f({"first", "Key"}, const_cast<QString&>(text.first));
                                     f({"second", "Value"}, text.second);
-                                },
-                                nullptr, nullptr, nullptr};
+                                }};
         fields.beginItem(index);
         fields.entry(entry, &item);
         fields.endItem(index);

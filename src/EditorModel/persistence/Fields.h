@@ -73,8 +73,9 @@ enum SequenceKind : int
     Group,        ///< a pair or a tuple: nothing
 };
 
-/// The visitor of field lists. A class tells its fields once, in archive order; what a visitor does with them,
-/// write, read or check, is its own affair. Any exception that leaves a field is noted with the field's key.
+/// The visitor of field lists. A class tells its fields once, in archive order; what a visitor does with
+/// them, write, read or check, is its own affair. Any exception that leaves a field is noted with the field's
+/// key.
 class EDITORMODEL_EXPORT Fields
 {
 public:
@@ -103,8 +104,8 @@ public:
     void pointer(const Key& key, const PointerField& field);
     void container(const Key& key, const Type& type, void* container);
 
-    /// The items of a container stand between `beginSequence` and `endSequence`. `count` is what is written; the
-    /// result is the number of items to visit.
+    /// The items of a container stand between `beginSequence` and `endSequence`. `count` is what is written;
+    /// the result is the number of items to visit.
     int beginSequence(SequenceKind kind, int count);
     void beginItem(int index);
     void endItem(int index);
@@ -153,8 +154,8 @@ EDITORMODEL_EXPORT void visit(Fields& fields, const Type& type, void* object);
 
 [[noreturn]] EDITORMODEL_EXPORT void throwRepeatedKey();
 
-/// Objects nested deeper than this, by value or through pointers, are refused on saving and loading alike: each
-/// level takes stack.
+/// Objects nested deeper than this, by value or through pointers, are refused on saving and loading alike:
+/// each level takes stack.
 constexpr int maxDepth = 1000;
 
 template <class T, class = void>
@@ -166,7 +167,10 @@ using ScalarField = std::enable_if_t<std::is_constructible_v<Scalar, std::in_pla
 template <class T>
 struct FieldOf<T, ScalarField<T>>
 {
-    static void visit(Fields& fields, const Key& key, T& value) { fields.scalar(key, Scalar(&value), &value); }
+    static void visit(Fields& fields, const Key& key, T& value)
+    {
+        fields.scalar(key, Scalar(&value), &value);
+    }
 };
 
 template <class T>
@@ -199,7 +203,8 @@ PointerField pointerField(T*& slot, bool soft)
     if constexpr (isPersistent<Class> && !std::is_abstract_v<Class>)
         declared = &Class::persistentType();
     return PointerField{
-        declared, const_cast<Class**>(&slot),
+        declared,
+        const_cast<Class**>(&slot),
         [](const PointerField& field) {
             const Class* const object = *static_cast<Class**>(field.slot);
             return object ? pointee(dynamic_cast<const void*>(object), typeid(*object), field.declared)
@@ -225,6 +230,14 @@ struct FieldOf<T*>
     }
 };
 
+/// Boost keeps no class information for standard collections of numbers.
+template <class C>
+constexpr bool isPlainCollection = false;
+template <class T>
+constexpr bool isPlainCollection<std::deque<T>> = std::is_arithmetic_v<T>;
+template <class T, class Less>
+constexpr bool isPlainCollection<std::set<T, Less>> = std::is_arithmetic_v<T>;
+
 /// The type constant of a container, whose field list is `visitItems`.
 template <class C>
 void visitItems(Fields& fields, void* container);
@@ -232,7 +245,7 @@ void visitItems(Fields& fields, void* container);
 template <class C>
 const Type& containerType()
 {
-    static const Type type{typeid(C), nullptr, false, 0, &visitItems<C>, nullptr, nullptr, nullptr};
+    static const Type type{typeid(C), &visitItems<C>, nullptr, false, !isPlainCollection<C>};
     return type;
 }
 
@@ -327,7 +340,7 @@ struct MapEntry
 
     static const Type& type()
     {
-        static const Type type{typeid(Pair), nullptr, false, 0, &visit, nullptr, nullptr, nullptr};
+        static const Type type{typeid(Pair), &visit};
         return type;
     }
 };

@@ -36,21 +36,23 @@ namespace Details {
 
 template <class T, class = void>
 struct CarriesMacro : std::false_type
-{
-};
+{};
 /// A derived class inherits the marker of its base, and is persistent only if it carries one of its own.
 template <class T>
-struct CarriesMacro<T, std::void_t<typename T::PersistentClass>> : std::is_same<typename T::PersistentClass, T>
-{
-};
+struct CarriesMacro<T, std::void_t<typename T::PersistentClass>>
+    : std::is_same<typename T::PersistentClass, T>
+{};
 
-EDITORMODEL_EXPORT void archiveFields(boost::archive::binary_oarchive& archive, const Type& type, void* object);
-EDITORMODEL_EXPORT void archiveFields(boost::archive::binary_iarchive& archive, const Type& type, void* object);
+EDITORMODEL_EXPORT void archiveFields(boost::archive::binary_oarchive& archive, const Type& type,
+                                      void* object);
+EDITORMODEL_EXPORT void archiveFields(boost::archive::binary_iarchive& archive, const Type& type,
+                                      void* object);
 EDITORMODEL_EXPORT void archiveFields(boost::archive::xml_oarchive& archive, const Type& type, void* object);
 EDITORMODEL_EXPORT void archiveFields(boost::archive::xml_iarchive& archive, const Type& type, void* object);
 EDITORMODEL_EXPORT void archiveFields(Json::oarchive& archive, const Type& type, void* object);
 EDITORMODEL_EXPORT void archiveFields(Json::iarchive& archive, const Type& type, void* object);
-EDITORMODEL_EXPORT void archiveFields(boost::archive::object_tracker& archive, const Type& type, void* object);
+EDITORMODEL_EXPORT void archiveFields(boost::archive::object_tracker& archive, const Type& type,
+                                      void* object);
 
 } // namespace Details
 
@@ -72,43 +74,42 @@ void serialize(Archive& archive, T& object, const boost::serialization::version_
 
 /// In the class: what every persistent class has, for a class that is written and read only where its type is
 /// known, and never made by name.
-#define EDITORMODEL_PERSISTENT_UNREGISTERED(Class)                                                                \
-public:                                                                                                          \
-    using PersistentClass = Class;                                                                               \
-    static const char* NameInArchive();                                                                          \
-    const std::string GetNameInArchive() const override;                                                         \
-    void Serialize(::Serialize::ISerializer& serializer) const override;                                         \
-    void Deserialize(::Serialize::IDeserializer& deserializer) override;                                         \
+#define EDITORMODEL_PERSISTENT_UNREGISTERED(Class)                                                           \
+public:                                                                                                      \
+    using PersistentClass = Class;                                                                           \
+    static const char* NameInArchive();                                                                      \
+    const std::string GetNameInArchive() const override;                                                     \
+    void Serialize(::Serialize::ISerializer& serializer) const override;                                     \
+    void Deserialize(::Serialize::IDeserializer& deserializer) override;                                     \
     static const ::Serialize::Type& persistentType();
 
 /// In the class: the same, and a registered name and creator. The class is default-constructible. Goes with
 /// `EDITORMODEL_ARCHIVE_NAME` behind the class and `EDITORMODEL_PERSISTENT_CLASS` in its source.
-#define EDITORMODEL_PERSISTENT(Class)                                                                             \
-    EDITORMODEL_PERSISTENT_UNREGISTERED(Class)                                                                   \
-    class Creator : public ::Serialize::BaseCreator                                                              \
-    {                                                                                                            \
-    public:                                                                                                      \
-        ::Serialize::ISerializable* Create() const override;                                                     \
-    };                                                                                                           \
-                                                                                                                 \
-private:                                                                                                         \
-    static const ::Serialize::Registrator s_registrator;                                                         \
-                                                                                                                 \
+#define EDITORMODEL_PERSISTENT(Class)                                                                        \
+    EDITORMODEL_PERSISTENT_UNREGISTERED(Class)                                                               \
+    class Creator : public ::Serialize::BaseCreator                                                          \
+    {                                                                                                        \
+    public:                                                                                                  \
+        ::Serialize::ISerializable* Create() const override;                                                 \
+    };                                                                                                       \
+                                                                                                             \
+private:                                                                                                     \
+    static const ::Serialize::Registrator s_registrator;                                                     \
+                                                                                                             \
 public:
 
-/// At global scope in the header of the class: its archive name, the key of both routes. Every client must see
-/// it, since Boost reads it where a client's own templates are instantiated.
-#define EDITORMODEL_ARCHIVE_NAME(Class, Name)                                                                     \
-    namespace boost {                                                                                            \
-    namespace serialization {                                                                                    \
-    template <>                                                                                                  \
-    struct guid_defined<Class> : std::true_type                                                                  \
-    {                                                                                                            \
-    };                                                                                                           \
-    template <>                                                                                                  \
-    constexpr const char* guid<Class>()                                                                          \
-    {                                                                                                            \
-        return Name;                                                                                             \
-    }                                                                                                            \
-    }                                                                                                            \
+/// At global scope in the header of the class: its archive name, the key of both routes. Every client must
+/// see it, since Boost reads it where a client's own templates are instantiated.
+#define EDITORMODEL_ARCHIVE_NAME(Class, Name)                                                                \
+    namespace boost {                                                                                        \
+    namespace serialization {                                                                                \
+    template <>                                                                                              \
+    struct guid_defined<Class> : std::true_type                                                              \
+    {};                                                                                                      \
+    template <>                                                                                              \
+    constexpr const char* guid<Class>()                                                                      \
+    {                                                                                                        \
+        return Name;                                                                                         \
+    }                                                                                                        \
+    }                                                                                                        \
     }

@@ -28,8 +28,7 @@ void visitBytes(Fields& fields, void* object)
 
 const Type& bytesType()
 {
-    static const Type type{typeid(QByteArray), boost::serialization::guid<QByteArray>(), true, 0, &visitBytes,
-                           nullptr,            nullptr,                                  nullptr};
+    static const Type type{typeid(QByteArray), &visitBytes, boost::serialization::guid<QByteArray>(), true};
     return type;
 }
 
@@ -46,8 +45,7 @@ void visitPixmap(Fields& fields, void* object)
 
 const Type& pixmapType()
 {
-    static const Type type{typeid(QPixmap), boost::serialization::guid<QPixmap>(), true, 0, &visitPixmap,
-                           nullptr,         nullptr,                               nullptr};
+    static const Type type{typeid(QPixmap), &visitPixmap, boost::serialization::guid<QPixmap>(), true};
     return type;
 }
 
@@ -71,17 +69,18 @@ void visitShared(Fields& fields, void* object)
 {
     auto& shared = *static_cast<std::shared_ptr<const Types::Image>*>(object);
     auto* picture = const_cast<Types::Image*>(shared.get());
-    const PointerField field{
-        &pictureType(),
-        &picture,
-        [](const PointerField& slot) { return Pointee{*static_cast<Types::Image**>(slot.slot), &pictureType()}; },
-        [](const PointerField&) -> const ISerializable* { return nullptr; },
-        [](const PointerField& slot, void* read, ISerializable* root) {
-            if (root)
-                throw std::bad_cast();
-            *static_cast<Types::Image**>(slot.slot) = static_cast<Types::Image*>(read);
-        },
-        false};
+    const PointerField field{&pictureType(),
+                             &picture,
+                             [](const PointerField& slot) {
+                                 return Pointee{*static_cast<Types::Image**>(slot.slot), &pictureType()};
+                             },
+                             [](const PointerField&) -> const ISerializable* { return nullptr; },
+                             [](const PointerField& slot, void* read, ISerializable* root) {
+                                 if (root)
+                                     throw std::bad_cast();
+                                 *static_cast<Types::Image**>(slot.slot) = static_cast<Types::Image*>(read);
+                             },
+                             false};
     fields.pointer("px", field);
     if (fields.loading())
         shared = picture ? fields.share(picture) : nullptr;
@@ -91,24 +90,17 @@ void visitShared(Fields& fields, void* object)
 
 const Type& pictureType()
 {
-    static const Type type{typeid(Types::Image), boost::serialization::guid<Types::Image>(),
-                           true,                 0,
-                           &visitPicture,        &createPicture,
-                           &destroyPicture,      nullptr};
+    static const Type type{
+        typeid(Types::Image), &visitPicture,  boost::serialization::guid<Types::Image>(), true, true, 0,
+        &createPicture,       &destroyPicture};
     static const TypeEntry entry(type);
     return type;
 }
 
 const Type& sharedPictureType()
 {
-    static const Type type{typeid(std::shared_ptr<const Types::Image>),
-                           nullptr,
-                           false,
-                           1,
-                           &visitShared,
-                           nullptr,
-                           nullptr,
-                           nullptr};
+    static const Type type{
+        typeid(std::shared_ptr<const Types::Image>), &visitShared, nullptr, false, true, 1};
     return type;
 }
 

@@ -20,8 +20,8 @@ const Type& pictureType();
 
 /// PNG data of a picture; throws where it cannot be made.
 QByteArray pngOf(const QPixmap& pixmap);
-/// Throws `std::runtime_error` for data that is no picture, and where no QGuiApplication exists, without which
-/// Qt would abort the process.
+/// Throws `std::runtime_error` for data that is no picture, and where no QGuiApplication exists, without
+/// which Qt would abort the process.
 QPixmap pixmapOfPng(const QByteArray& png);
 void requirePictures();
 

@@ -46,17 +46,14 @@ private:
         // A pair or a tuple stands as one item or several, as it was begun.
         m_stream.beginSequence(&count);
         if (kind == Group && count != expected)
-            throw std::runtime_error("a group of " + std::to_string(expected) + " has " + std::to_string(count) +
-                                     " items");
+            throw std::runtime_error("a group of " + std::to_string(expected) + " has " +
+                                     std::to_string(count) + " items");
         return count;
     }
 
     void onEntry(const Type& pair, void* entry) override { Details::visit(*this, pair, entry); }
 
-    void onBinary(QByteArray&, int) override
-    {
-        throw std::logic_error("the field stream has no raw bytes");
-    }
+    void onBinary(QByteArray&, int) override { throw std::logic_error("the field stream has no raw bytes"); }
 
     std::shared_ptr<const Types::Image> onShare(const Types::Image*) override
     {

@@ -20,23 +20,28 @@ template <class T>
 void visitFields(Fields& fields, T& object);
 } // namespace Details
 
-/// What persistence knows of one class or container: one constant of static storage each, constant-initialised,
-/// so that it is whole before any registration uses it. Addresses are of the complete object.
+/// What persistence knows of one class or container: one constant of static storage each,
+/// constant-initialised, so that it is whole before any registration uses it. Addresses are of the complete
+/// object.
 struct Type
 {
+    using Visit = void (*)(Fields& fields, void* object);
+
     const std::type_info& info;
-    /// The archive name of a class; null for a container.
-    const char* name;
-    /// The name is an export key: an object can be made from it.
-    bool exported;
-    unsigned int version;
     /// Runs the field list; the address is that of the class itself, which may be a base of a larger object.
-    void (*visit)(Fields& fields, void* object);
-    /// A default-constructed object on the heap; null for what is never made by name.
-    void* (*create)();
-    void (*destroy)(void* object);
+    Visit visit;
+    /// The archive name of a class; null for a container.
+    const char* name = nullptr;
+    /// The name is an export key: it may stand for an object of the class behind a pointer.
+    bool exported = false;
+    /// Archives write the class's number and version before its first object.
+    bool classInfo = true;
+    unsigned int version = 0;
+    /// A default-constructed object on the heap; null for what is never held by a pointer.
+    void* (*create)() = nullptr;
+    void (*destroy)(void* object) = nullptr;
     /// The persistent root of the object at the address; null for what has none.
-    ISerializable* (*serializable)(void* object);
+    ISerializable* (*serializable)(void* object) = nullptr;
 
     /// Cache of what the archives of the template route need; see ArchiveForms.
     mutable std::atomic<const Details::ArchiveForms*> forms{nullptr};
@@ -50,7 +55,8 @@ EDITORMODEL_EXPORT const Type* findType(const std::string& name);
 
 namespace Details {
 
-/// Enters a class for look-up by its `typeid` and its export key. Constructed statically in the class's source.
+/// Enters a class for look-up by its `typeid` and its export key. Constructed statically in the class's
+/// source.
 class EDITORMODEL_EXPORT TypeEntry
 {
 public:
@@ -84,12 +90,12 @@ void enterCast()
     CastEntry(Derived::persistentType(), typeid(Base), &upcast<Derived, Base>, &downcast<Derived, Base>);
 }
 
-/// Enters a registered class with its persistent bases; gives its name, so that a registrator can do this first.
+/// Enters a registered class with its persistent bases, the root among them; gives its name, so that a
+/// registrator can do this first.
 template <class T, class... Bases>
 const char* enter()
 {
     TypeEntry(T::persistentType());
-    enterCast<T, ISerializable>();
     (enterCast<T, Bases>(), ...);
     return T::persistentType().name;
 }
@@ -131,46 +137,49 @@ EDITORMODEL_EXPORT void readFields(IDeserializer& deserializer, const Type& type
 
 /// In the source of a class that carries `EDITORMODEL_PERSISTENT`, at global scope, behind its
 /// `void fields(Serialize::Fields& f, Class& object)`. Persistent bases follow the class.
-#define EDITORMODEL_PERSISTENT_CLASS(Class, ...)                                                                  \
-    EDITORMODEL_DETAILS_TYPE_(Class, ::boost::serialization::guid<Class>(), true)                                \
-    ::Serialize::ISerializable* Class::Creator::Create() const                                                   \
-    {                                                                                                            \
-        return new Class;                                                                                        \
-    }                                                                                                            \
-    const ::Serialize::Registrator Class::s_registrator(::Serialize::Details::enter<Class, ##__VA_ARGS__>(),     \
+#define EDITORMODEL_PERSISTENT_CLASS(...) EDITORMODEL_DETAILS_CLASS_(__VA_ARGS__, ::Serialize::ISerializable)
+
+#define EDITORMODEL_DETAILS_CLASS_(Class, ...)                                                               \
+    EDITORMODEL_DETAILS_TYPE_(Class, ::boost::serialization::guid<Class>(), true)                            \
+    ::Serialize::ISerializable* Class::Creator::Create() const                                               \
+    {                                                                                                        \
+        return new Class;                                                                                    \
+    }                                                                                                        \
+    const ::Serialize::Registrator Class::s_registrator(::Serialize::Details::enter<Class, __VA_ARGS__>(),   \
                                                         new Class::Creator);
 
-#define EDITORMODEL_DETAILS_TYPE_(Class, Name, Exported)                                                          \
-    template <>                                                                                                  \
-    void Serialize::Details::visitFields<Class>(::Serialize::Fields & f, Class & object)                         \
-    {                                                                                                            \
-        fields(f, object);                                                                                       \
-    }                                                                                                            \
-    const ::Serialize::Type& Class::persistentType()                                                             \
-    {                                                                                                            \
-        static const ::Serialize::Type type{typeid(Class),                                                       \
-                                            Name,                                                                \
-                                            Exported,                                                            \
-                                            0,                                                                   \
-                                            &::Serialize::Details::visitType<Class>,                             \
-                                            &::Serialize::Details::createType<Class>,                            \
-                                            &::Serialize::Details::destroyType<Class>,                           \
-                                            &::Serialize::Details::serializableOf<Class>};                       \
-        return type;                                                                                             \
-    }                                                                                                            \
-    const char* Class::NameInArchive()                                                                           \
-    {                                                                                                            \
-        return Name;                                                                                             \
-    }                                                                                                            \
-    const std::string Class::GetNameInArchive() const                                                            \
-    {                                                                                                            \
-        return Name;                                                                                             \
-    }                                                                                                            \
-    void Class::Serialize(::Serialize::ISerializer& serializer) const                                            \
-    {                                                                                                            \
-        ::Serialize::Details::writeFields(serializer, persistentType(), this);                                   \
-    }                                                                                                            \
-    void Class::Deserialize(::Serialize::IDeserializer& deserializer)                                            \
-    {                                                                                                            \
-        ::Serialize::Details::readFields(deserializer, persistentType(), this);                                  \
+#define EDITORMODEL_DETAILS_TYPE_(Class, Name, Exported)                                                     \
+    template <>                                                                                              \
+    void Serialize::Details::visitFields<Class>(::Serialize::Fields & f, Class & object)                     \
+    {                                                                                                        \
+        fields(f, object);                                                                                   \
+    }                                                                                                        \
+    const ::Serialize::Type& Class::persistentType()                                                         \
+    {                                                                                                        \
+        static const ::Serialize::Type type{typeid(Class),                                                   \
+                                            &::Serialize::Details::visitType<Class>,                         \
+                                            Name,                                                            \
+                                            Exported,                                                        \
+                                            true,                                                            \
+                                            0,                                                               \
+                                            &::Serialize::Details::createType<Class>,                        \
+                                            &::Serialize::Details::destroyType<Class>,                       \
+                                            &::Serialize::Details::serializableOf<Class>};                   \
+        return type;                                                                                         \
+    }                                                                                                        \
+    const char* Class::NameInArchive()                                                                       \
+    {                                                                                                        \
+        return Name;                                                                                         \
+    }                                                                                                        \
+    const std::string Class::GetNameInArchive() const                                                        \
+    {                                                                                                        \
+        return Name;                                                                                         \
+    }                                                                                                        \
+    void Class::Serialize(::Serialize::ISerializer& serializer) const                                        \
+    {                                                                                                        \
+        ::Serialize::Details::writeFields(serializer, persistentType(), this);                               \
+    }                                                                                                        \
+    void Class::Deserialize(::Serialize::IDeserializer& deserializer)                                        \
+    {                                                                                                        \
+        ::Serialize::Details::readFields(deserializer, persistentType(), this);                              \
     }
