@@ -6,6 +6,8 @@
 #include <EditorModel/persistence/ConstructionLog.h>
 #include <EditorModel/persistence/Fields.h>
 #include <EditorModel/persistence/Pictures.h>
+#include <EditorModel/persistence/Roots.h>
+#include <EditorModel/persistence/Unregistered.h>
 #include <EditorModel/persistence/Utf8.h>
 #include <EditorModel/types/Image.h>
 
@@ -287,12 +289,6 @@ std::string tagOf(const char* name)
             c = '.';
     }
     return tag;
-}
-
-[[noreturn]] void throwUnregistered()
-{
-    throw ba::archive_exception(ba::archive_exception::unregistered_class,
-                                "derived class not registered or exported");
 }
 
 /// What writing and reading share.
@@ -616,24 +612,20 @@ private:
     }
 };
 
-/// The root of a document: a pointer to a persistent object of any class.
 template <class Archive>
-void writeRoot(std::ostream& stream, const ISerializable& object)
+void writeRoots(std::ostream& stream, Roots& roots)
 {
     Archive archive(stream);
-    const ISerializable* root = &object;
     ArchiveWriter<Archive> fields(archive);
-    fields("object", root);
+    fields(rootsKey, roots);
 }
 
 template <class Archive>
-ISerializable* readRoot(std::istream& stream)
+void readRoots(std::istream& stream, Roots& roots)
 {
     Archive archive(stream);
-    ISerializable* root = nullptr;
     ArchiveReader<Archive> fields(archive);
-    fields("object", root);
-    return root;
+    fields(rootsKey, roots);
 }
 
 } // namespace
@@ -648,24 +640,24 @@ CastEntry::CastEntry(const Type& derived, const std::type_info& base, Cast up, C
     new Caster(formsOf(derived).info, bareInfo(base), up, down);
 }
 
-void writeBinaryArchive(std::ostream& stream, const ISerializable& root)
+void writeBinaryArchive(std::ostream& stream, Roots& roots)
 {
-    writeRoot<ba::binary_oarchive>(stream, root);
+    writeRoots<ba::binary_oarchive>(stream, roots);
 }
 
-void writeXmlArchive(std::ostream& stream, const ISerializable& root)
+void writeXmlArchive(std::ostream& stream, Roots& roots)
 {
-    writeRoot<ba::xml_oarchive>(stream, root);
+    writeRoots<ba::xml_oarchive>(stream, roots);
 }
 
-ISerializable* readBinaryArchive(std::istream& stream)
+void readBinaryArchive(std::istream& stream, Roots& roots)
 {
-    return readRoot<ba::binary_iarchive>(stream);
+    readRoots<ba::binary_iarchive>(stream, roots);
 }
 
-ISerializable* readXmlArchive(std::istream& stream)
+void readXmlArchive(std::istream& stream, Roots& roots)
 {
-    return readRoot<ba::xml_iarchive>(stream);
+    readRoots<ba::xml_iarchive>(stream, roots);
 }
 
 void archiveFields(ba::binary_oarchive& archive, const Type& type, void* object)

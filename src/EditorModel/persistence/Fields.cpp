@@ -35,6 +35,8 @@ void placed(const Key& key, int item, Body body)
     try {
         body();
     } catch (...) {
+        if (!key.archive)
+            throw;
         const bool isItem = std::strcmp(key.stream, itemKey.stream) == 0;
         FailurePlace::add(key.archive, isItem ? item : 0);
         throw;

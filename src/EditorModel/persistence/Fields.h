@@ -27,7 +27,8 @@ class Image;
 
 namespace Serialize {
 
-/// The key of a field: in the archives, and in the field stream where it has another name there.
+/// The key of a field: in the archives, and in the field stream where it has another name there. Null is a
+/// value without a key of its own.
 struct Key
 {
     const char* archive;
@@ -211,10 +212,10 @@ PointerField pointerField(T*& slot, bool soft)
                           : Pointee{nullptr, nullptr};
         },
         [](const PointerField& field) -> const ISerializable* { return *static_cast<Class**>(field.slot); },
-        [](const PointerField& field, void*, ISerializable* root) {
+        [](const PointerField& field, void* object, ISerializable* root) {
             Class*& target = *static_cast<Class**>(field.slot);
             target = dynamic_cast<Class*>(root);
-            if (root && !target && !field.soft)
+            if (object && !target && !field.soft)
                 throw std::bad_cast();
         },
         soft};

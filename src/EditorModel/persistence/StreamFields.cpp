@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The route over ISerializer and IDeserializer: field lists as calls of a field stream.
 #include <EditorModel/persistence/Fields.h>
+#include <EditorModel/persistence/Roots.h>
 #include <EditorModel/persistence/Serializer.h>
 
 #include <stdexcept>
@@ -137,6 +138,18 @@ void readFields(IDeserializer& deserializer, const Type& type, void* object)
     deserializer.stream().beginClass(record);
     visit(fields, type, object);
     deserializer.stream().endClass(record);
+}
+
+void writeStream(ISerializer& serializer, Roots& roots)
+{
+    FieldWriter fields(serializer);
+    fields(rootsKey, roots);
+}
+
+void readStream(IDeserializer& deserializer, Roots& roots)
+{
+    FieldReader fields(deserializer);
+    fields(rootsKey, roots);
 }
 
 } // namespace Details

@@ -1,0 +1,109 @@
+// SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/persistence/Frame.h>
+
+#include <QCryptographicHash>
+#include <QtEndian>
+
+namespace Document::Details {
+namespace {
+
+/// Not text in any encoding, and changed by whatever changes line ends.
+constexpr char signature[] = "\x89"
+                             "EDM\r\n\x1A\n";
+constexpr int signatureLength = 8;
+constexpr char frameVersion = 1;
+constexpr int digestLength = 32;
+constexpr int lengthOffset = signatureLength + 2;
+constexpr int digestOffset = lengthOffset + 8;
+constexpr int contentOffset = digestOffset + digestLength;
+
+constexpr char sealBegin[] = "<!-- EditorModel archive: ";
+constexpr char sealMiddle[] = " bytes, SHA-256 ";
+constexpr char sealEnd[] = " -->\n";
+
+QByteArray digest(const QByteArray& content)
+{
+    return QCryptographicHash::hash(content, QCryptographicHash::Sha256);
+}
+
+[[noreturn]] void throwDamaged()
+{
+    throw std::runtime_error("it is damaged: its content does not fit its checksum");
+}
+
+void checkLength(qint64 expected, qint64 found)
+{
+    if (expected > found)
+        throw std::runtime_error("it is cut off: " + std::to_string(expected) + " bytes are expected, " +
+                                 std::to_string(found) + " are there");
+    if (expected < found)
+        throw std::runtime_error("it goes on behind its end: " + std::to_string(expected) +
+                                 " bytes are expected, " + std::to_string(found) + " are there");
+}
+
+} // namespace
+
+QByteArray framed(const QByteArray& content, Route route)
+{
+    QByteArray document(signature, signatureLength);
+    document.reserve(contentOffset + content.size());
+    document += frameVersion;
+    document += static_cast<char>(route);
+    char length[8];
+    qToLittleEndian<qint64>(content.size(), length);
+    document.append(length, sizeof length);
+    document += digest(content);
+    document += content;
+    return document;
+}
+
+bool hasFrame(const QByteArray& document)
+{
+    return !document.isEmpty() && document.front() == signature[0];
+}
+
+Unframed unframed(const QByteArray& document)
+{
+    if (!document.startsWith(QByteArray::fromRawData(signature, signatureLength)))
+        throw std::runtime_error("it does not begin as a binary document does");
+    if (document.size() < contentOffset)
+        checkLength(contentOffset, document.size());
+    if (document[signatureLength] != frameVersion)
+        throw std::runtime_error("it is of version " + std::to_string(int(document[signatureLength])) +
+                                 ", which is not known");
+    const char route = document[signatureLength + 1];
+    if (route != Archive && route != Stream)
+        throwDamaged();
+    const auto length = qFromLittleEndian<qint64>(document.constData() + lengthOffset);
+    const QByteArray content = document.mid(contentOffset);
+    checkLength(length, content.size());
+    if (digest(content) != document.mid(digestOffset, digestLength))
+        throwDamaged();
+    return {static_cast<Route>(route), content};
+}
+
+QByteArray sealed(const QByteArray& content)
+{
+    return content + sealBegin + QByteArray::number(content.size()) + sealMiddle + digest(content).toHex() +
+           sealEnd;
+}
+
+QByteArray unsealed(const QByteArray& document)
+{
+    const int seal = document.lastIndexOf(sealBegin);
+    if (seal < 0)
+        throw std::runtime_error("it is cut off: the line that closes an archive is missing");
+    const QByteArray content = document.left(seal);
+    // Written anew, the seal must be the same to the last byte.
+    if (sealed(content) != document)
+        throwDamaged();
+    return content;
+}
+
+bool isXmlArchive(const QByteArray& document)
+{
+    return document.left(256).contains("<!DOCTYPE boost_serialization>") ||
+           document.lastIndexOf(sealBegin) >= 0;
+}
+
+} // namespace Document::Details

@@ -1,0 +1,562 @@
+// SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/persistence/ConstructionLog.h>
+#include <EditorModel/persistence/Json.h>
+#include <EditorModel/persistence/Pictures.h>
+#include <EditorModel/persistence/Unregistered.h>
+#include <EditorModel/persistence/Utf8.h>
+#include <EditorModel/types/Image.h>
+#include <EditorModel/types/StrictLookup.h>
+
+#include <cstring>
+#include <stdexcept>
+#include <unordered_map>
+
+namespace Serialize::Json {
+namespace {
+
+using MetaDetails::s_class_name;
+using MetaDetails::s_id;
+using MetaDetails::s_meta;
+using nlohmann::json;
+
+constexpr const char* countKey = "count";
+constexpr const char* itemVersionKey = "item_version";
+constexpr const char* bytesKey = "bytes";
+
+/// A collection's items and a tuple's elements share one key, whose node is an array of them. Elsewhere
+/// "item" is a key like any other.
+bool sharesKey(const json& node, const char* key)
+{
+    return std::strcmp(key, "element") == 0 || (std::strcmp(key, "item") == 0 && node.contains(countKey));
+}
+
+/// An object as archives know it: one address can be an object and its first base or member at once.
+struct Identity
+{
+    const void* object;
+    const Type* type;
+
+    bool operator==(const Identity& other) const { return object == other.object && type == other.type; }
+};
+
+struct IdentityHash
+{
+    std::size_t operator()(const Identity& identity) const
+    {
+        return std::hash<const void*>()(identity.object) * 31 + std::hash<const void*>()(identity.type);
+    }
+};
+
+} // namespace
+
+class oarchive::Writer final : public Fields
+{
+public:
+    explicit Writer(json& root) : Fields(false), m_root(root) { m_root = nullptr; }
+
+    json& head() { return m_nodes.empty() ? m_root : m_nodes.back(); }
+
+    void begin(const char* key)
+    {
+        if (key)
+            m_nodes.emplace_back();
+    }
+
+    void end(const char* key)
+    {
+        if (!key)
+            return;
+        json node = std::move(m_nodes.back());
+        m_nodes.pop_back();
+        json& parent = head();
+        if (sharesKey(parent, key))
+            parent[key].push_back(std::move(node));
+        else
+            parent[key] = std::move(node);
+    }
+
+private:
+    /// Where an object stands in the tree, by its members: nodes move, these do not.
+    struct Place
+    {
+        json::object_t* members;
+        std::size_t id;
+    };
+
+    template <class Body>
+    void within(const char* key, Body body)
+    {
+        begin(key);
+        body();
+        end(key);
+    }
+
+    void onScalar(const Key& key, const Scalar& value, const void*) override
+    {
+        within(key.archive, [&] { std::visit([&](auto* source) { save(*source); }, value); });
+    }
+
+    template <class T>
+    void save(T& value)
+    {
+        detail::save(head(), value);
+    }
+
+    void save(QString& text) { detail::save(head(), text.toStdString()); }
+    /// The low half of the count of milliseconds.
+    void save(MTime& time) { detail::save(head(), static_cast<int>(static_cast<quint32>(time.ms()))); }
+    void save(QPointF& point)
+    {
+        within("x", [&] { save(point.rx()); });
+        within("y", [&] { save(point.ry()); });
+    }
+    void save(std::shared_ptr<const Types::Image>& picture)
+    {
+        Details::visit(*this, Details::sharedPictureType(), &picture);
+    }
+
+    void onObject(const Key& key, const Type& type, void* object) override
+    {
+        within(key.archive, [&] {
+            head() = json::object();
+            if (!type.create) {
+                Details::visit(*this, type, object);
+                return;
+            }
+            const auto entered = m_places.try_emplace(Identity{object, &type}, Place{membersOfHead(), 0});
+            if (entered.second)
+                Details::visit(*this, type, object);
+            else
+                head()[s_meta][s_id] = idOf(entered.first->second);
+        });
+    }
+
+    void onBase(const Key& key, const Type& type, void* object) override
+    {
+        within(key.archive, [&] {
+            head() = json::object();
+            Details::visit(*this, type, object);
+        });
+    }
+
+    void onPointer(const Key& key, const PointerField& field) override
+    {
+        const Pointee pointee = field.get(field);
+        within(key.archive, [&] {
+            if (!pointee.object)
+                return;
+            if (!pointee.type || !pointee.type->exported)
+                Details::throwUnregistered();
+            head()[s_meta][s_class_name] = pointee.type->name;
+            const auto entered =
+                m_places.try_emplace(Identity{pointee.object, pointee.type}, Place{membersOfHead(), 0});
+            head()[s_meta][s_id] = idOf(entered.first->second);
+            if (entered.second)
+                Details::visit(*this, *pointee.type, pointee.object);
+        });
+    }
+
+    /// The identity of an object; one that was held by value so far gets its identity now.
+    std::size_t idOf(Place& place)
+    {
+        if (place.id == 0) {
+            place.id = ++m_lastId;
+            (*place.members)[s_meta][s_id] = place.id;
+        }
+        return place.id;
+    }
+
+    json::object_t* membersOfHead() { return head().get_ptr<json::object_t*>(); }
+
+    void onContainer(const Key& key, const Type& type, void* container) override
+    {
+        within(key.archive, [&] { Details::visit(*this, type, container); });
+    }
+
+    void onEntry(const Type& pair, void* entry) override { onContainer(Details::itemKey, pair, entry); }
+
+    int onBeginSequence(SequenceKind kind, int count) override
+    {
+        if (kind != Group)
+            head()[countKey] = count;
+        if (kind == Collection)
+            head()[itemVersionKey] = 0;
+        return count;
+    }
+
+    void onBeginItem(int) override {}
+    void onEndItem(int) override {}
+    void onEndSequence(int) override {}
+
+    void onBinary(QByteArray& bytes, int size) override
+    {
+        const QByteArray raw = QByteArray::fromRawData(bytes.constData(), size);
+        json& target = head().is_null() ? head() : head()[bytesKey];
+        target = raw.toBase64().toStdString();
+    }
+
+    std::shared_ptr<const Types::Image> onShare(const Types::Image*) override { return nullptr; }
+
+    json& m_root;
+    std::deque<json> m_nodes;
+    std::unordered_map<Identity, Place, IdentityHash> m_places;
+    std::size_t m_lastId = 0;
+};
+
+oarchive::oarchive(json& root) : m_writer(std::make_unique<Writer>(root)) {}
+
+oarchive::~oarchive() = default;
+
+json& oarchive::headRef()
+{
+    return m_writer->head();
+}
+
+void oarchive::save_binary(const void* address, std::size_t count)
+{
+    QByteArray bytes = QByteArray::fromRawData(static_cast<const char*>(address), static_cast<int>(count));
+    m_writer->binary(bytes, bytes.size());
+}
+
+Fields& oarchive::fields()
+{
+    return *m_writer;
+}
+
+void oarchive::begin(const char* key)
+{
+    m_writer->begin(key);
+}
+
+void oarchive::end(const char* key)
+{
+    m_writer->end(key);
+}
+
+void oarchive::number(qint64& value)
+{
+    detail::save(headRef(), value);
+}
+
+void oarchive::number(double& value)
+{
+    detail::save(headRef(), value);
+}
+
+class iarchive::Reader final : public Fields
+{
+public:
+    explicit Reader(const json& root) : Fields(true)
+    {
+        enterObjects(root);
+        m_heads.push_back({&root, 0});
+    }
+
+    const json& head() const { return *m_heads.back().node; }
+
+    void begin(const char* key)
+    {
+        if (key)
+            m_heads.push_back({&meant(under(key)), 0});
+    }
+
+    void end(const char* key)
+    {
+        if (key)
+            m_heads.pop_back();
+    }
+
+private:
+    /// A node that is being read, and how many of the items that share its key are read.
+    struct Head
+    {
+        const json* node;
+        std::size_t next;
+    };
+
+    /// An object that stands for an identifier.
+    struct Known
+    {
+        void* object;
+        const Type* type;
+    };
+
+    /// Notes where each identifier's object stands: the node that has more than its meta node. Walks without
+    /// recursion, as nothing bounds the depth of a tree.
+    void enterObjects(const json& root)
+    {
+        std::vector<const json*> pending{&root};
+        while (!pending.empty()) {
+            const json& node = *pending.back();
+            pending.pop_back();
+            ++m_budget;
+            if (const auto id = getObjectId(node))
+                enterObject(*id, node);
+            if (node.is_structured()) {
+                for (const json& child : node)
+                    pending.push_back(&child);
+            }
+        }
+        m_budget = m_budget * 2 + 64;
+    }
+
+    void enterObject(std::size_t id, const json& node)
+    {
+        const auto entered = m_nodes.try_emplace(id, &node);
+        if (entered.second || node.size() == 1)
+            return;
+        if (entered.first->second->size() > 1)
+            throw std::runtime_error("the identifier " + std::to_string(id) + " stands for two objects");
+        entered.first->second = &node;
+    }
+
+    const json& under(const char* key)
+    {
+        // A document that names parts of itself over and over could be read for ever.
+        if (m_budget-- == 0)
+            throw std::runtime_error("the document repeats its own parts without end");
+        Head& at = m_heads.back();
+        if (!at.node->is_object())
+            throw std::runtime_error(std::string("there is ") + at.node->type_name() + " where \"" + key +
+                                     "\" is expected");
+        const auto found = at.node->find(key);
+        if (found == at.node->end())
+            throw std::runtime_error(std::string("\"") + key + "\" is missing");
+        if (!sharesKey(*at.node, key))
+            return *found;
+        if (!found->is_array() || at.next >= found->size())
+            throw std::runtime_error(std::string("there are too few of \"") + key + "\"");
+        return (*found)[at.next++];
+    }
+
+    /// The node that a node's identifier names, or the node itself.
+    const json& meant(const json& node)
+    {
+        const auto id = getObjectId(node);
+        return id ? *Types::strictAt(m_nodes, *id) : node;
+    }
+
+    template <class Body>
+    void within(const char* key, Body body)
+    {
+        begin(key);
+        body();
+        end(key);
+    }
+
+    void onScalar(const Key& key, const Scalar& value, const void*) override
+    {
+        within(key.archive, [&] { std::visit([&](auto* target) { load(*target); }, value); });
+    }
+
+    template <class T>
+    void load(T& value)
+    {
+        detail::load(head(), value);
+    }
+
+    void load(QString& text)
+    {
+        std::string utf8;
+        detail::load(head(), utf8);
+        text = Details::textOfUtf8(utf8);
+    }
+
+    void load(MTime& time)
+    {
+        int low = 0;
+        detail::load(head(), low);
+        time = MTime(low);
+    }
+
+    void load(QPointF& point)
+    {
+        within("x", [&] { load(point.rx()); });
+        within("y", [&] { load(point.ry()); });
+    }
+
+    void load(std::shared_ptr<const Types::Image>& picture)
+    {
+        Details::visit(*this, Details::sharedPictureType(), &picture);
+    }
+
+    void onObject(const Key& key, const Type& type, void* object) override
+    {
+        within(key.archive, [&] {
+            requireObject();
+            const auto id = getObjectId(head());
+            if (id && type.create)
+                m_known.try_emplace(*id, Known{object, &type});
+            Details::visit(*this, type, object);
+        });
+    }
+
+    void onBase(const Key& key, const Type& type, void* object) override
+    {
+        within(key.archive, [&] {
+            requireObject();
+            Details::visit(*this, type, object);
+        });
+    }
+
+    void onPointer(const Key& key, const PointerField& field) override
+    {
+        within(key.archive, [&] {
+            const Known read = head().is_null() ? Known{nullptr, nullptr} : readObject();
+            const bool hasRoot = read.type && read.type->serializable;
+            field.set(field, read.object, hasRoot ? read.type->serializable(read.object) : nullptr);
+        });
+    }
+
+    Known readObject()
+    {
+        requireObject();
+        const auto id = getObjectId(head());
+        if (id) {
+            const auto known = m_known.find(*id);
+            if (known != m_known.end())
+                return known->second;
+        }
+        const Type& type = typeOfHead();
+        const Known made{Details::ConstructionLog::make(type), &type};
+        if (id)
+            m_known.emplace(*id, made);
+        Details::visit(*this, type, made.object);
+        return made;
+    }
+
+    const Type& typeOfHead() const
+    {
+        const auto meta = head().find(s_meta);
+        if (meta == head().end() || !meta->is_object() || !meta->contains(s_class_name))
+            throw std::runtime_error("an object has no class name");
+        std::string name;
+        detail::load((*meta)[s_class_name], name);
+        const Type* const type =
+            name == Details::pictureType().name ? &Details::pictureType() : findType(name);
+        if (!type || !type->create)
+            Details::throwUnregistered();
+        return *type;
+    }
+
+    void requireObject() const
+    {
+        if (!head().is_object())
+            throw std::runtime_error(std::string("there is ") + head().type_name() +
+                                     " where an object is expected");
+    }
+
+    void onContainer(const Key& key, const Type& type, void* container) override
+    {
+        within(key.archive, [&] { Details::visit(*this, type, container); });
+    }
+
+    void onEntry(const Type& pair, void* entry) override { onContainer(Details::itemKey, pair, entry); }
+
+    int onBeginSequence(SequenceKind kind, int count) override
+    {
+        if (kind == Group)
+            return count;
+        within(countKey, [&] { load(count); });
+        const auto items = head().find(Details::itemKey.archive);
+        const std::size_t stored = items == head().end() || !items->is_array() ? 0 : items->size();
+        if (count < 0 || static_cast<std::size_t>(count) != stored)
+            throw std::runtime_error("there are " + std::to_string(stored) + " items where " +
+                                     std::to_string(count) + " are counted");
+        return count;
+    }
+
+    void onBeginItem(int) override {}
+    void onEndItem(int) override {}
+    void onEndSequence(int) override {}
+
+    void onBinary(QByteArray& bytes, int size) override
+    {
+        std::string text;
+        if (head().is_string())
+            load(text);
+        else
+            within(bytesKey, [&] { load(text); });
+        const auto decoded = QByteArray::fromBase64Encoding(QByteArray::fromStdString(text),
+                                                            QByteArray::AbortOnBase64DecodingErrors);
+        if (!decoded)
+            throw std::runtime_error("the bytes are not in base64");
+        if (decoded.decoded.size() != size)
+            throw std::runtime_error("there are " + std::to_string(decoded.decoded.size()) + " bytes where " +
+                                     std::to_string(size) + " are counted");
+        bytes = decoded.decoded;
+    }
+
+    std::shared_ptr<const Types::Image> onShare(const Types::Image* image) override
+    {
+        auto& owner = m_pictures[image];
+        if (!owner) {
+            Details::ConstructionLog::release(const_cast<Types::Image*>(image));
+            owner.reset(image);
+        }
+        return owner;
+    }
+
+    std::vector<Head> m_heads;
+    std::unordered_map<std::size_t, const json*> m_nodes;
+    std::unordered_map<std::size_t, Known> m_known;
+    std::unordered_map<const Types::Image*, std::shared_ptr<const Types::Image>> m_pictures;
+    std::size_t m_budget = 0;
+};
+
+iarchive::iarchive(const json& root) : m_reader(std::make_unique<Reader>(root)) {}
+
+iarchive::~iarchive() = default;
+
+const json& iarchive::headRef() const
+{
+    return m_reader->head();
+}
+
+void iarchive::load_binary(void* address, std::size_t count)
+{
+    QByteArray bytes;
+    m_reader->binary(bytes, static_cast<int>(count));
+    std::memcpy(address, bytes.constData(), count);
+}
+
+Fields& iarchive::fields()
+{
+    return *m_reader;
+}
+
+void iarchive::begin(const char* key)
+{
+    m_reader->begin(key);
+}
+
+void iarchive::end(const char* key)
+{
+    m_reader->end(key);
+}
+
+void iarchive::number(qint64& value)
+{
+    detail::load(headRef(), value);
+}
+
+void iarchive::number(double& value)
+{
+    detail::load(headRef(), value);
+}
+
+} // namespace Serialize::Json
+
+namespace Serialize::Details {
+
+void archiveFields(Json::oarchive& archive, const Type& type, void* object)
+{
+    visit(archive.fields(), type, object);
+}
+
+void archiveFields(Json::iarchive& archive, const Type& type, void* object)
+{
+    visit(archive.fields(), type, object);
+}
+
+} // namespace Serialize::Details

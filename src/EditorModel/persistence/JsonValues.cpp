@@ -1,0 +1,144 @@
+// SPDX-License-Identifier: Apache-2.0
+// Single values of the Json archives.
+#include <EditorModel/persistence/Json.h>
+#include <EditorModel/persistence/Utf8.h>
+
+#include <cmath>
+#include <limits>
+#include <stdexcept>
+
+namespace Serialize::Json {
+
+namespace MetaDetails {
+const std::string s_meta = "$meta";
+const std::string s_class_name = "class";
+const std::string s_id = "id";
+} // namespace MetaDetails
+
+std::optional<std::size_t> getObjectId(const nlohmann::json& node)
+{
+    if (!node.is_object())
+        return std::nullopt;
+    const auto meta = node.find(MetaDetails::s_meta);
+    if (meta == node.end() || !meta->is_object())
+        return std::nullopt;
+    const auto id = meta->find(MetaDetails::s_id);
+    if (id == meta->end())
+        return std::nullopt;
+    if (!id->is_number_unsigned())
+        throw std::runtime_error("the identifier " + id->dump() + " is no whole number");
+    return id->get<std::size_t>();
+}
+
+namespace detail {
+namespace {
+
+constexpr const char* infinite = "inf";
+constexpr const char* minusInfinite = "-inf";
+constexpr const char* notANumber = "nan";
+
+[[noreturn]] void throwOther(const char* expected, const nlohmann::json& node)
+{
+    throw std::runtime_error(std::string("there is ") + node.type_name() + " where " + expected +
+                             " is expected");
+}
+
+template <class Number>
+void loadWhole(const nlohmann::json& node, Number& value)
+{
+    if (!node.is_number_integer())
+        throwOther("a whole number", node);
+    using Limits = std::numeric_limits<Number>;
+    const bool fits = node.is_number_unsigned()
+                          ? node.get<std::uint64_t>() <= static_cast<std::uint64_t>(Limits::max())
+                          : node.get<std::int64_t>() >= static_cast<std::int64_t>(Limits::min()) &&
+                                node.get<std::int64_t>() <= static_cast<std::int64_t>(Limits::max());
+    if (!fits)
+        throw std::runtime_error("the number " + node.dump() + " is out of range");
+    value = node.get<Number>();
+}
+
+} // namespace
+
+void save(nlohmann::json& node, const std::string& value)
+{
+    Details::requireUtf8(value);
+    node = value;
+}
+
+void save(nlohmann::json& node, bool value)
+{
+    node = value;
+}
+
+void save(nlohmann::json& node, double value)
+{
+    if (std::isfinite(value))
+        node = value;
+    else
+        node = std::isnan(value) ? notANumber : value > 0 ? infinite : minusInfinite;
+}
+
+void save(nlohmann::json& node, int value)
+{
+    node = value;
+}
+
+void save(nlohmann::json& node, unsigned int value)
+{
+    node = value;
+}
+
+void save(nlohmann::json& node, qint64 value)
+{
+    node = value;
+}
+
+void load(const nlohmann::json& node, std::string& value)
+{
+    if (!node.is_string())
+        throwOther("a text", node);
+    value = node.get_ref<const std::string&>();
+}
+
+void load(const nlohmann::json& node, bool& value)
+{
+    if (!node.is_boolean())
+        throwOther("a boolean", node);
+    value = node.get<bool>();
+}
+
+void load(const nlohmann::json& node, double& value)
+{
+    if (node.is_number()) {
+        value = node.get<double>();
+        return;
+    }
+    const std::string* const text = node.get_ptr<const std::string*>();
+    if (text && *text == infinite)
+        value = std::numeric_limits<double>::infinity();
+    else if (text && *text == minusInfinite)
+        value = -std::numeric_limits<double>::infinity();
+    else if (text && *text == notANumber)
+        value = std::numeric_limits<double>::quiet_NaN();
+    else
+        throwOther("a number", node);
+}
+
+void load(const nlohmann::json& node, int& value)
+{
+    loadWhole(node, value);
+}
+
+void load(const nlohmann::json& node, unsigned int& value)
+{
+    loadWhole(node, value);
+}
+
+void load(const nlohmann::json& node, qint64& value)
+{
+    loadWhole(node, value);
+}
+
+} // namespace detail
+} // namespace Serialize::Json

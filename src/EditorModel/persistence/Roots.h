@@ -1,0 +1,25 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include <EditorModel/persistence/Serializable.h>
+
+#include <deque>
+#include <iosfwd>
+
+namespace Serialize::Details {
+
+/// The objects of a document, held by pointer, as one field of whatever stores them. Readers give what they
+/// make to the current construction log.
+using Roots = std::deque<const ISerializable*>;
+
+constexpr const char* rootsKey = "objects";
+
+void writeBinaryArchive(std::ostream& stream, Roots& roots);
+void writeXmlArchive(std::ostream& stream, Roots& roots);
+void readBinaryArchive(std::istream& stream, Roots& roots);
+void readXmlArchive(std::istream& stream, Roots& roots);
+
+void writeStream(ISerializer& serializer, Roots& roots);
+void readStream(IDeserializer& deserializer, Roots& roots);
+
+} // namespace Serialize::Details
