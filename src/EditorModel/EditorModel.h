@@ -1,12 +1,24 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-// Everything but <EditorModel/persistence/Json.h> and <EditorModel/persistence/ObjectTracker.h>, which bring the
-// headers of the archives' libraries along.
+// Everything but <EditorModel/persistence/Json.h> and <EditorModel/persistence/ObjectTracker.h>, which bring
+// the headers of the archives' libraries along.
 
 #include <EditorModel/Export.h>
+#include <EditorModel/bus/Messages.h>
+#include <EditorModel/bus/Preview.h>
 #include <EditorModel/bus/PubSub.h>
+#include <EditorModel/bus/TypedView.h>
+#include <EditorModel/bus/View.h>
 #include <EditorModel/library/EditorCollection.h>
+#include <EditorModel/media/Audio.h>
+#include <EditorModel/media/File.h>
+#include <EditorModel/media/FileTarget.h>
+#include <EditorModel/media/Media.h>
+#include <EditorModel/media/Object.h>
+#include <EditorModel/media/Video.h>
+#include <EditorModel/media/Views.h>
+#include <EditorModel/persistence/FieldArchive.h>
 #include <EditorModel/persistence/Fields.h>
 #include <EditorModel/persistence/Persistent.h>
 #include <EditorModel/persistence/Serializable.h>
@@ -14,7 +26,9 @@
 #include <EditorModel/persistence/Type.h>
 #include <EditorModel/services/AppEvents.h>
 #include <EditorModel/services/Command.h>
+#include <EditorModel/services/Report.h>
 #include <EditorModel/services/Statistics.h>
+#include <EditorModel/services/Task.h>
 #include <EditorModel/services/Tutorial.h>
 #include <EditorModel/types/AvTime.h>
 #include <EditorModel/types/Decibel.h>
