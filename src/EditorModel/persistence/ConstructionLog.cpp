@@ -2,6 +2,7 @@
 #include <EditorModel/persistence/ConstructionLog.h>
 
 #include <EditorModel/persistence/Type.h>
+#include <EditorModel/persistence/Unregistered.h>
 
 #include <algorithm>
 #include <utility>
@@ -10,6 +11,11 @@ namespace Serialize::Details {
 namespace {
 
 thread_local ConstructionLog* current = nullptr;
+
+void destroyNamed(void* object)
+{
+    delete static_cast<ISerializable*>(object);
+}
 
 } // namespace
 
@@ -25,8 +31,21 @@ void* ConstructionLog::make(const Type& type)
 {
     if (!current)
         return type.create();
-    current->m_made.push_back({nullptr, &type});
+    current->m_made.push_back({nullptr, type.destroy});
     return current->m_made.back().object = type.create();
+}
+
+ISerializable* ConstructionLog::makeNamed(const std::string& name)
+{
+    const BaseCreator* const creator = findCreator(name);
+    if (!creator)
+        throwUnregistered();
+    if (!current)
+        return creator->Create();
+    current->m_made.push_back({nullptr, &destroyNamed});
+    ISerializable* const object = creator->Create();
+    current->m_made.back().object = object;
+    return object;
 }
 
 void ConstructionLog::release(void* object)
@@ -53,7 +72,7 @@ void destroyAll(std::vector<ConstructionLog::Made>& made) noexcept
 {
     for (auto entry = made.rbegin(); entry != made.rend(); ++entry) {
         if (entry->object)
-            entry->type->destroy(entry->object);
+            entry->destroy(entry->object);
     }
     made.clear();
 }

@@ -1,10 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include <EditorModel/Export.h>
+
+#include <string>
 #include <vector>
 
 namespace Serialize {
 
+class ISerializable;
 struct Type;
 
 namespace Details {
@@ -12,13 +16,14 @@ namespace Details {
 /// Owns every object that a load makes until the load has succeeded: archives themselves free only what they
 /// finished. The innermost log of a thread takes what is made on it; without one nothing is noted, and
 /// objects belong to whoever reads them.
-class ConstructionLog
+class EDITORMODEL_EXPORT ConstructionLog
 {
 public:
     struct Made
     {
+        /// What `destroy` takes: not always the address of the complete object.
         void* object;
-        const Type* type;
+        void (*destroy)(void* object);
     };
 
     ConstructionLog();
@@ -28,7 +33,10 @@ public:
 
     /// Makes an object of a type and notes it in the current log.
     static void* make(const Type& type);
-    /// Takes an object out of the current log: somebody else owns it.
+    /// The same by registered name, for classes that have a creator and perhaps no type. Throws
+    /// `boost::archive::archive_exception` for a name that is not registered.
+    static ISerializable* makeNamed(const std::string& name);
+    /// Takes an object that was made of a type out of the current log: somebody else owns it.
     static void release(void* object);
 
     /// Everything noted, in the order of making; the log is empty afterwards.
@@ -40,7 +48,7 @@ private:
 };
 
 /// Frees in reverse order of making.
-void destroyAll(std::vector<ConstructionLog::Made>& made) noexcept;
+EDITORMODEL_EXPORT void destroyAll(std::vector<ConstructionLog::Made>& made) noexcept;
 
 } // namespace Details
 } // namespace Serialize
