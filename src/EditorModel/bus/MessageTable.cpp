@@ -64,13 +64,10 @@ Snapshot MessageTable::snapshot(const Object* sender, const RecipientList& all)
     }
     const RecipientList& recipients = some ? *some : all;
     const std::size_t count = recipients.size();
-    if (count == 0) {
-        return {nullptr, 0};
-    }
     if (count > 1) {
-        push(recipients.begin(), recipients.end());
+        push(recipients);
     }
-    return {recipients.begin()->subscriber, count};
+    return {recipients.first().subscriber, count};
 }
 
 /// Somebody who is in both lists is reached once.
@@ -79,24 +76,24 @@ Snapshot MessageTable::snapshotOfBoth(const Object* sender, const RecipientList&
 {
     const std::size_t begin = m_state.used;
     reserve(some.size() + all.size());
-    push(some.begin(), some.end());
-    for (const Recipient& recipient : all) {
+    push(some);
+    all.forEach([&](const Recipient& recipient) {
         if (!m_registrations.find(recipient.subscriber)->base->isSubscribed(sender)) {
             m_state.snapshots[m_state.used++] = recipient;
         }
-    }
-    const Snapshot result{m_state.snapshots[begin].subscriber, m_state.used - begin};
+    });
+    const Snapshot result{some.first().subscriber, m_state.used - begin};
     if (result.count == 1) {
         m_state.used = begin;
     }
     return result;
 }
 
-void MessageTable::push(const Recipient* begin, const Recipient* end)
+void MessageTable::push(const RecipientList& recipients)
 {
-    reserve(static_cast<std::size_t>(end - begin));
-    std::copy(begin, end, m_state.snapshots + m_state.used);
-    m_state.used += static_cast<std::size_t>(end - begin);
+    reserve(recipients.size());
+    recipients.copyTo(m_state.snapshots + m_state.used);
+    m_state.used += recipients.size();
 }
 
 void MessageTable::reserve(std::size_t count)

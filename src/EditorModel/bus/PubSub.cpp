@@ -3,7 +3,7 @@
 
 #include <EditorModel/bus/detail/MessageTable.h>
 
-#include <boost/container/small_vector.hpp>
+#include <QVarLengthArray>
 
 #include <algorithm>
 #include <mutex>
@@ -22,9 +22,9 @@ namespace {
 /// One message type for which a subscriber is registered.
 struct Registration
 {
-    std::type_index messageType;
-    MessageTable* table;
-    Recipient recipient;
+    std::type_index messageType = typeid(void);
+    MessageTable* table = nullptr;
+    Recipient recipient = {};
 };
 
 struct Nothing
@@ -34,7 +34,7 @@ struct Nothing
 
 struct SubscriberBase::Subscriptions
 {
-    using Registrations = boost::container::small_vector<Registration, 3>;
+    using Registrations = QVarLengthArray<Registration, 3>;
 
     PointerMap<Nothing> objects;
     std::vector<std::type_index> types;
@@ -50,22 +50,18 @@ struct SubscriberBase::Subscriptions
     }
 
     /// Takes one registration out of its table with everything that it is subscribed to there.
-    void leave(MessageTable& table, Recipient recipient)
+    void leave(Registrations::iterator left)
     {
+        const Registration registration = *left;
+        *left = registrations.last();
+        registrations.removeLast();
         objects.forEach([&](const void* object, Nothing) {
-            table.unsubscribe(recipient, static_cast<const Object*>(object));
+            registration.table->unsubscribe(registration.recipient, static_cast<const Object*>(object));
         });
         for (const std::type_index& type : types) {
-            table.unsubscribeAll(recipient, type);
+            registration.table->unsubscribeAll(registration.recipient, type);
         }
-        table.unregisterSubscriber(recipient.subscriber);
-        registrations.erase(std::remove_if(registrations.begin(), registrations.end(),
-                                           [&](const Registration& registration) {
-                                               return registration.recipient.registration ==
-                                                          recipient.registration &&
-                                                      registration.table == &table;
-                                           }),
-                            registrations.end());
+        registration.table->unregisterSubscriber(registration.recipient.subscriber);
     }
 };
 
@@ -104,8 +100,8 @@ SubscriberBase& SubscriberBase::operator=(const SubscriberBase& other)
 
 SubscriberBase::~SubscriberBase()
 {
-    while (!m_subscriptions->registrations.empty()) {
-        const Registration last = m_subscriptions->registrations.back();
+    while (!m_subscriptions->registrations.isEmpty()) {
+        const Registration last = m_subscriptions->registrations.last();
         unregisterSelf(this, last.recipient.subscriber, last.messageType);
     }
 }
@@ -184,9 +180,10 @@ void SubscriberBase::registerSelf(SubscriberBase* base, void* subscriber, const 
         return;
     }
     MessageTable& table = Dispatcher::instance().table(messageType);
+    own.registrations.reserve(own.registrations.size() + 1);
     const Recipient recipient{subscriber, table.registerSubscriber(subscriber, *base)};
+    own.registrations.append({messageType, &table, recipient});
     try {
-        own.registrations.push_back({messageType, &table, recipient});
         own.objects.forEach([&](const void* object, Nothing) {
             table.subscribe(recipient, static_cast<const Object*>(object));
         });
@@ -194,7 +191,7 @@ void SubscriberBase::registerSelf(SubscriberBase* base, void* subscriber, const 
             table.subscribeAll(recipient, type);
         }
     } catch (...) {
-        own.leave(table, recipient);
+        own.leave(own.registrations.end() - 1);
         throw;
     }
 }
@@ -210,7 +207,7 @@ void SubscriberBase::unregisterSelf(SubscriberBase* base, void* subscriber,
     Subscriptions& own = *base->m_subscriptions;
     const auto found = own.find(subscriber, messageType);
     if (found != own.registrations.end()) {
-        own.leave(*found->table, found->recipient);
+        own.leave(found);
     }
 }
 

@@ -10,19 +10,11 @@ constexpr std::size_t searchable = 16;
 
 void RecipientList::add(const Recipient& recipient)
 {
-    m_recipients.push_back(recipient);
+    append(recipient);
     try {
-        if (m_positions) {
-            m_positions->add(recipient.subscriber) = m_recipients.size() - 1;
-        } else if (m_recipients.size() > searchable) {
-            auto positions = std::make_unique<PointerMap<std::size_t>>();
-            for (std::size_t i = 0; i != m_recipients.size(); ++i) {
-                positions->add(m_recipients[i].subscriber) = i;
-            }
-            m_positions = std::move(positions);
-        }
+        index();
     } catch (...) {
-        m_recipients.pop_back();
+        removeLast();
         throw;
     }
 }
@@ -30,13 +22,13 @@ void RecipientList::add(const Recipient& recipient)
 void RecipientList::remove(const void* subscriber)
 {
     const std::size_t found = position(subscriber);
-    if (found == m_recipients.size()) {
+    if (found == size()) {
         return;
     }
-    const Recipient last = m_recipients.back();
-    m_recipients[found] = last;
-    m_recipients.pop_back();
-    if (m_positions && m_recipients.size() <= searchable / 2) {
+    const Recipient last = at(size() - 1);
+    at(found) = last;
+    removeLast();
+    if (m_positions && size() <= searchable / 2) {
         m_positions.reset();
     } else if (m_positions) {
         *m_positions->find(last.subscriber) = found;
@@ -44,17 +36,50 @@ void RecipientList::remove(const void* subscriber)
     }
 }
 
-std::size_t RecipientList::position(const void* subscriber) const
+/// Where the subscriber stands; size() if it does not.
+std::size_t RecipientList::position(const void* subscriber)
 {
     if (m_positions) {
         const std::size_t* found = m_positions->find(subscriber);
-        return found ? *found : m_recipients.size();
+        return found ? *found : size();
     }
     std::size_t i = 0;
-    while (i != m_recipients.size() && m_recipients[i].subscriber != subscriber) {
+    while (i != size() && at(i).subscriber != subscriber) {
         ++i;
     }
     return i;
+}
+
+/// Notes the position of the last member, or those of all when the list becomes a long one.
+void RecipientList::index()
+{
+    if (m_positions) {
+        m_positions->add(at(size() - 1).subscriber) = size() - 1;
+    } else if (size() > searchable) {
+        auto positions = std::make_unique<PointerMap<std::size_t>>();
+        for (std::size_t i = 0; i != size(); ++i) {
+            positions->add(at(i).subscriber) = i;
+        }
+        m_positions = std::move(positions);
+    }
+}
+
+void RecipientList::append(const Recipient& recipient)
+{
+    if (isEmpty()) {
+        m_first = recipient;
+    } else {
+        m_rest.push_back(recipient);
+    }
+}
+
+void RecipientList::removeLast()
+{
+    if (m_rest.empty()) {
+        m_first = {nullptr, 0};
+    } else {
+        m_rest.pop_back();
+    }
 }
 
 } // namespace PubSub::Details

@@ -38,7 +38,7 @@ private:
     };
 
     Snapshot snapshotOfBoth(const Object* sender, const RecipientList& some, const RecipientList& all);
-    void push(const Recipient* begin, const Recipient* end);
+    void push(const RecipientList& recipients);
     void reserve(std::size_t count);
 
     DeliveryState m_state;

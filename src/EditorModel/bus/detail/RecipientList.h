@@ -4,20 +4,35 @@
 #include <EditorModel/bus/PubSub.h>
 #include <EditorModel/bus/detail/PointerMap.h>
 
-#include <boost/container/small_vector.hpp>
+#include <algorithm>
+#include <vector>
 
 namespace PubSub::Details {
 
-/// The recipients of one object, or of all objects of a type, side by side in memory and in no order. Most
-/// objects have one or two; a long list keeps the positions of its members, so that leaving it doesn't search
-/// it.
+/// The recipients of one object, or of all objects of a type, in no order. Most objects have one, which lies
+/// in the list itself. A long list keeps the positions of its members, so that leaving it doesn't search it.
 class RecipientList
 {
 public:
-    std::size_t size() const { return m_recipients.size(); }
-    bool isEmpty() const { return m_recipients.empty(); }
-    const Recipient* begin() const { return m_recipients.data(); }
-    const Recipient* end() const { return m_recipients.data() + m_recipients.size(); }
+    std::size_t size() const { return m_first.subscriber ? 1 + m_rest.size() : 0; }
+    bool isEmpty() const { return !m_first.subscriber; }
+    const Recipient& first() const { return m_first; }
+
+    /// Writes size() entries; the list must not be empty.
+    void copyTo(Recipient* target) const
+    {
+        *target = m_first;
+        std::copy(m_rest.begin(), m_rest.end(), target + 1);
+    }
+
+    template <typename Visit>
+    void forEach(Visit visit) const
+    {
+        if (!isEmpty()) {
+            visit(m_first);
+        }
+        std::for_each(m_rest.begin(), m_rest.end(), visit);
+    }
 
     /// The recipient must not be in the list.
     void add(const Recipient& recipient);
@@ -25,9 +40,14 @@ public:
     void remove(const void* subscriber);
 
 private:
-    std::size_t position(const void* subscriber) const;
+    Recipient& at(std::size_t position) { return position ? m_rest[position - 1] : m_first; }
+    std::size_t position(const void* subscriber);
+    void index();
+    void append(const Recipient& recipient);
+    void removeLast();
 
-    boost::container::small_vector<Recipient, 1> m_recipients;
+    Recipient m_first{nullptr, 0};
+    std::vector<Recipient> m_rest;
     std::unique_ptr<PointerMap<std::size_t>> m_positions;
 };
 
