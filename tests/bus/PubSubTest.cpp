@@ -1,23 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "DispatcherProbe.h"
 #include "Listeners.h"
 
 #include <deque>
 #include <memory>
 #include <thread>
-
-namespace PubSub::Details {
-
-class DispatcherProbe
-{
-public:
-    template <typename M, typename T>
-    static std::deque<void*> subscribers(const M& message, const PubSub::Object* sender)
-    {
-        return Dispatcher::instance().getSubscribers(message, typeid(M), sender, typeid(T));
-    }
-};
-
-} // namespace PubSub::Details
 
 namespace {
 
