@@ -22,9 +22,9 @@ void fields(Serialize::Fields& f, Leaf& leaf)
     f("number", leaf.number)("text", leaf.text);
 }
 
-void fields(Serialize::Fields& f, Stone& stone)
+void fields(Serialize::Fields& f, Moss& moss)
 {
-    f("weight", stone.weight);
+    f("number", moss.number)("text", moss.text);
 }
 
 void fields(Serialize::Fields& f, Trunk& trunk)
@@ -60,15 +60,23 @@ void fields(Serialize::Fields& f, Album& album)
     f("cover", album.cover)("back", album.back);
 }
 
+int Counted::s_deleted = 0;
+
+void fields(Serialize::Fields& f, Counted& counted)
+{
+    f("next", counted.next)("also", counted.also);
+}
+
 void fields(Serialize::Fields&, Nothing&) {}
 
 } // namespace Sample
 
 EDITORMODEL_PERSISTENT_CLASS(Sample::Leaf)
-EDITORMODEL_PERSISTENT_CLASS(Sample::Stone)
+EDITORMODEL_PERSISTENT_CLASS(Sample::Moss)
 EDITORMODEL_PERSISTENT_CLASS(Sample::Trunk)
 EDITORMODEL_PERSISTENT_CLASS(Sample::Bark)
 EDITORMODEL_PERSISTENT_CLASS(Sample::Tree, Sample::Trunk, Sample::Bark)
 EDITORMODEL_PERSISTENT_CLASS(Sample::Grove)
 EDITORMODEL_PERSISTENT_CLASS(Sample::Album)
+EDITORMODEL_PERSISTENT_CLASS(Sample::Counted)
 EDITORMODEL_PERSISTENT_CLASS(Sample::Nothing)

@@ -39,12 +39,13 @@ class Leaf : public Serialize::ISerializable, public virtual PubSub::Object
     QString text;
 };
 
-/// A second root of objects that a pointer to a `Leaf` does not take.
-class Stone : public Serialize::ISerializable, public virtual PubSub::Object
+/// Stored as a `Leaf` is, under a name of the same length; a pointer to a `Leaf` does not take it.
+class Moss : public Serialize::ISerializable, public virtual PubSub::Object
 {
-    EDITORMODEL_PERSISTENT(Stone)
+    EDITORMODEL_PERSISTENT(Moss)
 
-    int weight = 0;
+    int number = 0;
+    QString text;
 };
 
 class Trunk : public virtual Serialize::ISerializable, public virtual PubSub::Object
@@ -119,6 +120,22 @@ class Nothing : public Serialize::ISerializable, public virtual PubSub::Object
     EDITORMODEL_PERSISTENT(Nothing)
 };
 
+/// Counts its deletions.
+class Counted : public Serialize::ISerializable, public virtual PubSub::Object
+{
+    EDITORMODEL_PERSISTENT(Counted)
+
+    Counted() = default;
+    Counted(const Counted&) = default;
+    Counted& operator=(const Counted&) = default;
+    ~Counted() override { ++s_deleted; }
+
+    static int s_deleted;
+
+    const Counted* next = nullptr;
+    const Counted* also = nullptr;
+};
+
 /// Derived from a persistent class, but not one itself.
 class Stray : public Leaf
 {};
@@ -126,10 +143,11 @@ class Stray : public Leaf
 } // namespace Sample
 
 EDITORMODEL_ARCHIVE_NAME(Sample::Leaf, "Sample::Leaf")
-EDITORMODEL_ARCHIVE_NAME(Sample::Stone, "Sample::Stone")
+EDITORMODEL_ARCHIVE_NAME(Sample::Moss, "Sample::Moss")
 EDITORMODEL_ARCHIVE_NAME(Sample::Trunk, "Sample::Trunk")
 EDITORMODEL_ARCHIVE_NAME(Sample::Bark, "Sample::Bark")
 EDITORMODEL_ARCHIVE_NAME(Sample::Tree, "Sample::Tree")
 EDITORMODEL_ARCHIVE_NAME(Sample::Grove, "Sample::Grove")
 EDITORMODEL_ARCHIVE_NAME(Sample::Album, "Sample::Album")
+EDITORMODEL_ARCHIVE_NAME(Sample::Counted, "Sample::Counted")
 EDITORMODEL_ARCHIVE_NAME(Sample::Nothing, "Sample::Nothing")

@@ -555,23 +555,25 @@ private:
                 field.set(field, nullptr, nullptr);
                 return;
             }
-            const Type* const type =
-                findType(static_cast<const bs::typeid_system::extended_type_info_typeid_0&>(found->get_eti())
-                             .get_typeid(),
-                         field.declared);
+            const Type* const type = findType(typeidOf(found->get_eti()), field.declared);
             if (!type)
                 throwUnregistered();
             field.set(field, object, type->serializable ? type->serializable(object) : nullptr);
         });
     }
 
+    static const std::type_info& typeidOf(const bs::extended_type_info& info)
+    {
+        return static_cast<const bs::typeid_system::extended_type_info_typeid_0&>(info).get_typeid();
+    }
+
+    /// Boost's own table may hold a form that a client's templates made: what that makes goes into no log.
     static const ba::detail::basic_pointer_iserializer* find(const bs::extended_type_info& info)
     {
-        const auto* const found = static_cast<const ba::detail::basic_pointer_iserializer*>(
-            ba::detail::archive_serializer_map<Archive>::find(info));
-        if (!found)
+        const Type* const type = findType(typeidOf(info), nullptr);
+        if (!type)
             throwUnregistered();
-        return found;
+        return formsOf(*type).template of<Archive>().pointer.get();
     }
 
     int onBeginSequence(SequenceKind kind, int count) override

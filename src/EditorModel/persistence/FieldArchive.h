@@ -3,6 +3,7 @@
 
 #include <EditorModel/persistence/Fields.h>
 
+#include <boost/archive/archive_exception.hpp>
 #include <boost/mpl/bool.hpp>
 #include <boost/serialization/collection_size_type.hpp>
 #include <boost/serialization/item_version_type.hpp>

@@ -25,7 +25,7 @@ std::optional<std::size_t> getObjectId(const nlohmann::json& node)
     const auto id = meta->find(MetaDetails::s_id);
     if (id == meta->end())
         return std::nullopt;
-    if (!id->is_number_unsigned())
+    if (!id->is_number_integer() || *id < 0)
         throw std::runtime_error("the identifier " + id->dump() + " is no whole number");
     return id->get<std::size_t>();
 }

@@ -1,0 +1,283 @@
+// SPDX-License-Identifier: Apache-2.0
+// The shape of the Json archive's tree, and what its reader refuses.
+#include "tests/archives/SampleClasses.h"
+
+#include <EditorModel/persistence/ConstructionLog.h>
+#include <EditorModel/persistence/Json.h>
+
+#include <gtest/gtest.h>
+
+namespace {
+
+using boost::serialization::make_nvp;
+using nlohmann::json;
+using Serialize::Json::iarchive;
+using Serialize::Json::oarchive;
+
+template <class T>
+json saved(const T& value)
+{
+    json root;
+    oarchive(root) << make_nvp("content", value);
+    return root;
+}
+
+template <class T>
+void load(const json& root, T& value)
+{
+    iarchive archive(root);
+    archive >> make_nvp("content", value);
+}
+
+template <class T>
+std::string errorOf(const json& root, T& value)
+{
+    const Serialize::Details::ConstructionLog log;
+    try {
+        load(root, value);
+    } catch (const std::exception& error) {
+        return error.what();
+    }
+    return "nothing was thrown";
+}
+
+TEST(JsonArchive, AValueHasItsFieldsUnderTheirKeys)
+{
+    EXPECT_EQ(saved(Sample::Leaf(4, QStringLiteral("four"))),
+              json::parse(R"({"content": {"number": 4, "text": "four"}})"));
+}
+
+TEST(JsonArchive, AClassWithoutFieldsIsAnObjectWithoutMembers)
+{
+    EXPECT_EQ(saved(Sample::Nothing()), json::parse(R"({"content": {}})"));
+}
+
+TEST(JsonArchive, AValueWithoutAKeyIsTheHeadItself)
+{
+    json root;
+    {
+        oarchive archive(root);
+        archive << 5;
+        EXPECT_EQ(archive.headRef(), 5);
+    }
+    EXPECT_EQ(root, 5);
+    int loaded = 0;
+    iarchive archive(root);
+    archive >> loaded;
+    EXPECT_EQ(loaded, 5);
+    EXPECT_EQ(archive.headRef(), 5);
+}
+
+TEST(JsonArchive, ANullPointerIsANullUnderItsKeyWithNoClassName)
+{
+    const Sample::Leaf* const null = nullptr;
+    EXPECT_EQ(saved(null), json::parse(R"({"content": null})"));
+}
+
+TEST(JsonArchive, APointerNamesItsClassAndEveryLaterMentionItsIdentity)
+{
+    const Sample::Leaf leaf(4, QStringLiteral("four"));
+    const std::deque<const Sample::Leaf*> leaves = {&leaf, nullptr, &leaf};
+    EXPECT_EQ(saved(leaves), json::parse(R"({"content": {"count": 3, "item_version": 0, "item": [
+        {"$meta": {"class": "Sample::Leaf", "id": 1}, "number": 4, "text": "four"},
+        null,
+        {"$meta": {"class": "Sample::Leaf", "id": 1}}]}})"));
+}
+
+TEST(JsonArchive, AnObjectHeldByValueGetsAnIdentityWhenAPointerNamesIt)
+{
+    Sample::Tree tree;
+    tree.other = &tree;
+    const json root = saved(tree);
+    EXPECT_EQ(root["content"]["$meta"], json::parse(R"({"id": 1})"));
+    EXPECT_EQ(root["content"]["other"], json::parse(R"({"$meta": {"class": "Sample::Tree", "id": 1}})"));
+    EXPECT_FALSE(root["content"]["inner"].contains("$meta"));
+}
+
+TEST(JsonArchive, ContainersHaveTheirCountsAndItems)
+{
+    Sample::Grove grove;
+    grove.numbers = {7, 8};
+    grove.words = {{QStringLiteral("a")}, {}};
+    grove.grid = {{1, {{2, 0.5}}}};
+    grove.triple = {QStringLiteral("t"), 3, Sample::Dark};
+    grove.notes = {{QStringLiteral("k"), QStringLiteral("v")}};
+    const json content = saved(grove)["content"];
+    EXPECT_EQ(content["numbers"], json::parse(R"({"count": 2, "item_version": 0, "item": [7, 8]})"));
+    EXPECT_EQ(content["words"], json::parse(R"({"count": 2, "item_version": 0, "item": [
+        {"count": 1, "item_version": 0, "item": ["a"]}, {"count": 0, "item_version": 0}]})"));
+    EXPECT_EQ(content["grid"], json::parse(R"({"count": 1, "item_version": 0, "item": [
+        {"first": 1, "second": {"count": 1, "item_version": 0, "item": [{"first": 2, "second": 0.5}]}}]})"));
+    EXPECT_EQ(content["couple"], json::parse(R"({"first": null, "second": null})"));
+    EXPECT_EQ(content["triple"], json::parse(R"({"element": ["t", 3, 7]})"));
+    EXPECT_EQ(content["notes"], json::parse(R"({"count": 1, "item": [{"first": "k", "second": "v"}]})"));
+    EXPECT_EQ(content["list"], json::parse(R"({"count": 0})"));
+}
+
+TEST(JsonArchive, AMapOfTextsWithoutEntriesIsACountOfZero)
+{
+    EXPECT_EQ(saved(QMap<QString, QString>()), json::parse(R"({"content": {"count": 0}})"));
+}
+
+TEST(JsonArchive, ABaseStandsUnderItsOwnName)
+{
+    Sample::Tree tree;
+    tree.girth = 1.5;
+    tree.rough = true;
+    const json content = saved(tree)["content"];
+    EXPECT_EQ(content["Sample::Trunk"], json::parse(R"({"girth": 1.5})"));
+    EXPECT_EQ(content["Sample::Bark"], json::parse(R"({"rough": true, "next": null})"));
+}
+
+TEST(JsonArchive, NumbersThatJsonHasNotAreTexts)
+{
+    json root;
+    Serialize::Json::detail::save(root, std::numeric_limits<double>::infinity());
+    EXPECT_EQ(root, "inf");
+    Serialize::Json::detail::save(root, -std::numeric_limits<double>::infinity());
+    EXPECT_EQ(root, "-inf");
+    Serialize::Json::detail::save(root, std::numeric_limits<double>::quiet_NaN());
+    EXPECT_EQ(root, "nan");
+}
+
+TEST(JsonArchive, BytesAreBase64)
+{
+    json root;
+    {
+        oarchive archive(root);
+        archive.save_binary("\x00\xFF\x10", 3);
+    }
+    EXPECT_EQ(root, "AP8Q");
+    char bytes[3] = {};
+    iarchive archive(root);
+    archive.load_binary(bytes, 3);
+    EXPECT_EQ(std::string(bytes, 3), std::string("\x00\xFF\x10", 3));
+    EXPECT_THROW(archive.load_binary(bytes, 2), std::runtime_error);
+}
+
+TEST(JsonArchive, AnIdentifierThatIsNotInTheTableThrows)
+{
+    // A node that names an identity is always in the table itself; what is missing there can only come from a
+    // node that was not part of the tree when the archive began.
+    json root = json::parse(R"({"content": {"number": 1, "text": ""}})");
+    iarchive archive(root);
+    root["content"]["$meta"]["id"] = 5;
+    Sample::Leaf leaf;
+    try {
+        archive >> make_nvp("content", leaf);
+        FAIL() << "an unknown identifier was read";
+    } catch (const std::out_of_range& error) {
+        EXPECT_STREQ(error.what(), "invalid map<K, T> key");
+    }
+}
+
+TEST(JsonArchive, AMentionMayStandBeforeWhatItNames)
+{
+    const json root = json::parse(R"({"content": {"count": 2, "item_version": 0, "item": [
+        {"$meta": {"class": "Sample::Leaf", "id": 9}},
+        {"$meta": {"class": "Sample::Leaf", "id": 9}, "number": 4, "text": "four"}]}})");
+    std::deque<const Sample::Leaf*> leaves;
+    load(root, leaves);
+    const std::unique_ptr<const Sample::Leaf> owned(leaves.at(0));
+    EXPECT_EQ(leaves.at(0), leaves.at(1));
+    EXPECT_EQ(leaves.at(0)->number, 4);
+}
+
+TEST(JsonArchive, AKeyItemOutsideACollectionIsAKeyLikeAnyOther)
+{
+    json root;
+    {
+        const int three = 3;
+        oarchive archive(root);
+        archive << make_nvp("item", three);
+    }
+    EXPECT_EQ(root, json::parse(R"({"item": 3})"));
+    int loaded = 0;
+    iarchive archive(root);
+    archive >> make_nvp("item", loaded);
+    EXPECT_EQ(loaded, 3);
+}
+
+TEST(JsonArchive, DamageIsNamed)
+{
+    Sample::Leaf leaf;
+    EXPECT_EQ(errorOf(json::parse(R"({})"), leaf), "\"content\" is missing");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": 3})"), leaf), "there is number where an object is expected");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"text": ""}})"), leaf), "\"number\" is missing");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"number": "1", "text": ""}})"), leaf),
+              "there is string where a whole number is expected");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"number": 2147483648, "text": ""}})"), leaf),
+              "the number 2147483648 is out of range");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"number": 1.5, "text": ""}})"), leaf),
+              "there is number where a whole number is expected");
+
+    const Sample::Leaf* pointer = nullptr;
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"number": 1, "text": ""}})"), pointer),
+              "an object has no class name");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"$meta": {"class": "No::Such"}}})"), pointer),
+              "unregistered class - derived class not registered or exported");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"$meta": {"class": "QPixmap"}}})"), pointer),
+              "unregistered class - derived class not registered or exported");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"$meta": {"class": "Sample::Leaf", "id": -1}}})"), pointer),
+              "the identifier -1 is no whole number");
+
+    std::deque<int> numbers;
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": 3, "item_version": 0, "item": [1]}})"), numbers),
+              "there are 1 items where 3 are counted");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": -1, "item_version": 0}})"), numbers),
+              "there are 0 items where -1 are counted");
+
+    std::map<int, double> map;
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": 2, "item_version": 0, "item": [
+                  {"first": 1, "second": 0}, {"first": 1, "second": 0}]}})"),
+                      map),
+              "the key of a map stands twice");
+}
+
+TEST(JsonArchive, OneIdentifierForTwoObjectsIsRefused)
+{
+    const json root = json::parse(R"({"content": {"count": 2, "item_version": 0, "item": [
+        {"$meta": {"class": "Sample::Leaf", "id": 9}, "number": 5, "text": "five"},
+        {"$meta": {"class": "Sample::Leaf", "id": 9}, "number": 4, "text": "four"}]}})");
+    std::deque<const Sample::Leaf*> leaves;
+    EXPECT_EQ(errorOf(root, leaves), "the identifier 9 stands for two objects");
+}
+
+/// Each level of nested lists names the level below it ten times: eight levels would be a hundred million
+/// items.
+TEST(JsonArchive, ADocumentThatRepeatsItsOwnPartsIsRefused)
+{
+    using Level1 = std::deque<Sample::Leaf>;
+    using Level2 = std::deque<Level1>;
+    using Level3 = std::deque<Level2>;
+    using Level4 = std::deque<Level3>;
+    json parts = json::array();
+    const auto list = [](json item, int times) {
+        json items = json::array();
+        for (int i = 0; i < times; ++i)
+            items.push_back(item);
+        return json{{"count", times}, {"item_version", 0}, {"item", items}};
+    };
+    const auto mention = [](int id) { return json{{"$meta", {{"id", id}}}}; };
+    json leaf = {{"number", 1}, {"text", "x"}, {"$meta", {{"id", 1}}}};
+    json root;
+    for (int level = 1; level <= 4; ++level) {
+        parts.push_back(leaf);
+        leaf = list(mention(level), 100);
+        leaf["$meta"]["id"] = level + 1;
+    }
+    root["parts"] = parts;
+    root["content"] = leaf;
+    Level4 lists;
+    EXPECT_EQ(errorOf(root, lists), "the document repeats its own parts without end");
+}
+
+TEST(JsonArchive, AnObjectThatHoldsItselfByValueIsRefused)
+{
+    const json root = json::parse(R"({"content": {"$meta": {"id": 1}, "count": 1, "item_version": 0,
+        "item": [{"$meta": {"id": 1}}]}})");
+    std::deque<std::deque<Sample::Leaf>> lists;
+    EXPECT_EQ(errorOf(root, lists), "\"number\" is missing");
+}
+
+} // namespace
