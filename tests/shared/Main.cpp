@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <gmock/gmock.h>
 
+#include <QByteArray>
 #include <QtGlobal>
 
 int main(int argc, char** argv)
