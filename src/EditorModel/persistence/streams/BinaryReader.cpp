@@ -53,7 +53,8 @@ std::string describe(int tag)
     case PointTag:
         return "a point";
     default:
-        return tag == newName || tag >= static_cast<int>(firstName) ? "a field" : "the byte " + std::to_string(tag);
+        return tag == newName || tag >= static_cast<int>(firstName) ? "a field"
+                                                                    : "the byte " + std::to_string(tag);
     }
 }
 
@@ -79,7 +80,7 @@ public:
         case PictureTag:
             return {Mark::Object, ++m_lastId, pictureClass};
         default:
-            throwUnexpected("an object for " + quoted(key), describe(tag));
+            throwUnexpected("an object for " + inQuotes(key), describe(tag));
         }
     }
 
@@ -97,7 +98,8 @@ public:
         const quint64 count = takeCount();
         // Each item has at least a byte at either end.
         if (count > left() / 2 || count > static_cast<quint64>(std::numeric_limits<int>::max()))
-            throw std::runtime_error("a sequence of " + std::to_string(count) + " items is longer than the document");
+            throw std::runtime_error("a sequence of " + std::to_string(count) +
+                                     " items is longer than the document");
         return static_cast<int>(count);
     }
 
@@ -110,7 +112,7 @@ public:
         takeKey(key);
         const int tag = takeByte();
         if (tag != TrueTag && tag != FalseTag)
-            throwUnexpected(describe(TrueTag) + " for " + quoted(key), describe(tag));
+            throwUnexpected(describe(TrueTag) + " for " + inQuotes(key), describe(tag));
         value = tag == TrueTag;
     }
 
@@ -172,7 +174,8 @@ private:
     const char* takeBytes(std::size_t size)
     {
         if (size > left())
-            throwUnexpected(std::to_string(size) + " bytes", "the end of the document after " + std::to_string(left()));
+            throwUnexpected(std::to_string(size) + " bytes",
+                            "the end of the document after " + std::to_string(left()));
         const char* const bytes = m_document.constData() + m_position;
         m_position += size;
         return bytes;
@@ -233,10 +236,10 @@ private:
     {
         const quint64 number = takeCount();
         if (number != newName && number < firstName)
-            throwUnexpected("the field " + quoted(key), describe(static_cast<int>(number)));
+            throwUnexpected("the field " + inQuotes(key), describe(static_cast<int>(number)));
         const std::string name = nameOf(number);
         if (name != key)
-            throwUnexpected("the field " + quoted(key), "the field " + quoted(name));
+            throwUnexpected("the field " + inQuotes(key), "the field " + inQuotes(name));
     }
 
     void takeTagged(const std::string& key, Tag expected)
@@ -244,7 +247,7 @@ private:
         takeKey(key);
         const int tag = takeByte();
         if (tag != expected)
-            throwUnexpected(describe(expected) + " for " + quoted(key), describe(tag));
+            throwUnexpected(describe(expected) + " for " + inQuotes(key), describe(tag));
     }
 
     void take(Tag expected)

@@ -11,8 +11,8 @@
 namespace Serialize::Details {
 namespace {
 
-/// Numbers of fixed width are little-endian, counts and lengths of varying width: seven bits a byte, the lowest
-/// first, the top bit set in all but the last. A name stands once, and as its number from then on.
+/// Numbers of fixed width are little-endian, counts and lengths of varying width: seven bits a byte, the
+/// lowest first, the top bit set in all but the last. A name stands once, and as its number from then on.
 class BinaryWriter final : public FormWriter
 {
 public:

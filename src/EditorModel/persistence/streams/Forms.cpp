@@ -14,7 +14,8 @@ void writeAll(QIODevice& device, const char* data, qint64 size)
     while (size > 0) {
         const qint64 written = device.write(data, size);
         if (written <= 0)
-            throw std::runtime_error("the device does not take the document: " + device.errorString().toStdString());
+            throw std::runtime_error("the device does not take the document: " +
+                                     device.errorString().toStdString());
         data += written;
         size -= written;
     }
@@ -24,7 +25,8 @@ void flush(QIODevice& device)
 {
     auto* const file = qobject_cast<QFileDevice*>(&device);
     if (file && !file->flush())
-        throw std::runtime_error("the device does not take the document: " + device.errorString().toStdString());
+        throw std::runtime_error("the device does not take the document: " +
+                                 device.errorString().toStdString());
 }
 
 std::string textOf(double value)
@@ -43,11 +45,11 @@ double realOf(const std::string& text)
     const char* const end = text.data() + text.size();
     const auto result = std::from_chars(text.data(), end, value);
     if (text.empty() || result.ec != std::errc() || result.ptr != end)
-        throwUnexpected("a number", quoted(text));
+        throwUnexpected("a number", inQuotes(text));
     return value;
 }
 
-std::string quoted(const std::string& text)
+std::string inQuotes(const std::string& text)
 {
     constexpr std::size_t longest = 60;
     if (text.size() <= longest)

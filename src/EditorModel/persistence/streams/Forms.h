@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-// What the forms of a field stream have in common: how a value, an object and a sequence are put down. What may
-// stand where and who is who is decided above them.
+// What the forms of a field stream have in common: how a value, an object and a sequence are put down. What
+// may stand where and who is who is decided above them.
 #pragma once
 
 #include <EditorModel/types/MTime.h>
@@ -115,7 +115,7 @@ std::string textOf(double value);
 double realOf(const std::string& text);
 
 /// Text of a document in a message: in quotes, and cut where it is long.
-std::string quoted(const std::string& text);
+std::string inQuotes(const std::string& text);
 [[noreturn]] void throwUnexpected(const std::string& expected, const std::string& found);
 
 } // namespace Serialize::Details

@@ -22,9 +22,9 @@ std::string describe(const Mark& mark)
     case Mark::Reference:
         return "a reference to object " + std::to_string(mark.id);
     case Mark::Object:
-        return "an object of the class " + quoted(mark.className);
+        return "an object of the class " + inQuotes(mark.className);
     case Mark::Part:
-        return "the part of the base " + quoted(mark.className);
+        return "the part of the base " + inQuotes(mark.className);
     }
     return {};
 }
@@ -73,7 +73,8 @@ void GraphReader::readFields(ISerializable& object)
     const std::size_t depth = m_nesting.depth();
     object.Deserialize(*this);
     if (m_begun == before || m_nesting.depth() != depth)
-        throw std::logic_error("the class " + quoted(object.GetNameInArchive()) + " does not read itself as one class");
+        throw std::logic_error("the class " + inQuotes(object.GetNameInArchive()) +
+                               " does not read itself as one class");
 }
 
 void GraphReader::beginClass(const ClassRecord& record)
@@ -91,11 +92,11 @@ void GraphReader::beginMarked(const Mark& mark, const ClassRecord& record)
     const Identity identity(record.object);
     const bool isPart = !identity.address || m_nesting.isOpen(identity);
     if (isPart)
-        requireKind(mark, Mark::Part, "the part of the base " + quoted(record.name));
+        requireKind(mark, Mark::Part, "the part of the base " + inQuotes(record.name));
     else
-        requireKind(mark, Mark::Object, "an object of the class " + quoted(record.name));
+        requireKind(mark, Mark::Object, "an object of the class " + inQuotes(record.name));
     if (mark.className != record.name)
-        throwUnexpected("the class " + quoted(record.name), quoted(mark.className));
+        throwUnexpected("the class " + inQuotes(record.name), inQuotes(mark.className));
     // Known before its fields are read: they may point back at it.
     if (!isPart)
         note(mark.id, const_cast<ISerializable*>(record.object), nullptr);

@@ -52,7 +52,8 @@ void GraphWriter::writeNew(const ISerializable& object, bool byPointer)
     m_behindPointer = byPointer;
     object.Serialize(*this);
     if (m_lastId == before || m_nesting.depth() != depth)
-        throw std::logic_error("the class " + quoted(object.GetNameInArchive()) + " does not write itself as one class");
+        throw std::logic_error("the class " + inQuotes(object.GetNameInArchive()) +
+                               " does not write itself as one class");
 }
 
 void GraphWriter::beginClass(const ClassRecord& record)
@@ -75,7 +76,7 @@ quint64 GraphWriter::number(const Identity& identity, const std::string& classNa
     if (!place.second) {
         // A reader has made an object of its own for that pointer already.
         if (place.first->second.byPointer)
-            throw std::runtime_error("an object of the class " + quoted(className) +
+            throw std::runtime_error("an object of the class " + inQuotes(className) +
                                      " is held by value, but a pointer to it was written before");
         place.first->second = object;
     }

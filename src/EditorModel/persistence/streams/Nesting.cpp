@@ -11,8 +11,8 @@
 namespace Serialize::Details {
 namespace {
 
-/// Field lists are held to `maxDepth` before they come here; one of their levels opens at most a sequence and an
-/// item, or a class. This stops the classes that write themselves without a field list.
+/// Field lists are held to `maxDepth` before they come here; one of their levels opens at most a sequence and
+/// an item, or a class. This stops the classes that write themselves without a field list.
 constexpr std::size_t maxLevels = 3 * static_cast<std::size_t>(maxDepth);
 
 } // namespace
@@ -30,9 +30,9 @@ void Nesting::field(const char* key)
     if (!key)
         throw std::logic_error("a field without a key");
     if (m_announced)
-        throw std::logic_error("the field " + quoted(m_key) + " has no value");
+        throw std::logic_error("the field " + inQuotes(m_key) + " has no value");
     if (!m_levels.empty() && m_levels.back().kind == Sequence)
-        throw std::logic_error("the field " + quoted(key) + " stands in no item of its sequence");
+        throw std::logic_error("the field " + inQuotes(key) + " stands in no item of its sequence");
     m_key = key;
     m_announced = true;
 }
@@ -56,7 +56,8 @@ void Nesting::endClass(const std::string& name)
 {
     const Level& level = top(Class, "endClass");
     if (level.name != name)
-        throw std::logic_error("endClass for " + quoted(name) + " where " + quoted(level.name) + " is open");
+        throw std::logic_error("endClass for " + inQuotes(name) + " where " + inQuotes(level.name) +
+                               " is open");
     close();
 }
 
@@ -80,8 +81,8 @@ void Nesting::beginItem(int index)
 {
     Level& level = top(Sequence, "beginItem");
     if (index != level.index + 1 || index > level.count)
-        throw std::logic_error("item " + std::to_string(index) + " behind item " + std::to_string(level.index) +
-                               " of " + std::to_string(level.count));
+        throw std::logic_error("item " + std::to_string(index) + " behind item " +
+                               std::to_string(level.index) + " of " + std::to_string(level.count));
     level.index = index;
     open({Item, {}, {}, 0, index});
 }
@@ -103,7 +104,7 @@ bool Nesting::isOpen(const Identity& object) const
 void Nesting::finish() const
 {
     if (m_announced)
-        throw std::logic_error("the field " + quoted(m_key) + " has no value");
+        throw std::logic_error("the field " + inQuotes(m_key) + " has no value");
     if (!m_levels.empty())
         throw std::logic_error("the stream ends while something is open");
 }
@@ -118,7 +119,7 @@ void Nesting::open(Level level)
 Nesting::Level& Nesting::top(Kind kind, const char* operation)
 {
     if (m_announced)
-        throw std::logic_error("the field " + quoted(m_key) + " has no value");
+        throw std::logic_error("the field " + inQuotes(m_key) + " has no value");
     if (m_levels.empty() || m_levels.back().kind != kind)
         throw std::logic_error(std::string(operation) + " out of order");
     return m_levels.back();

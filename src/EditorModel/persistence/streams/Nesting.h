@@ -12,7 +12,7 @@ class ISerializable;
 
 namespace Details {
 
-/// Who an object is. The address alone does not tell: an object and its first member share it.
+/// Who an object is. The address alone does not tell: one that is gone may have left it to one of another class.
 struct Identity
 {
     const void* address = nullptr;

@@ -1,30 +1,30 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <QString>
+#include <QLatin1String>
 
 /// Tags, attributes and values of the XML form. Stored data.
 namespace Serialize::Details::Xml {
 
-inline const QString root = QStringLiteral("EditorModel");
-inline const QString route = QStringLiteral("route");
-inline const QString stream = QStringLiteral("stream");
-inline const QString version = QStringLiteral("version");
+inline constexpr QLatin1String root("EditorModel");
+inline constexpr QLatin1String route("route");
+inline constexpr QLatin1String stream("stream");
+inline constexpr QLatin1String version("version");
 constexpr int currentVersion = 1;
 
-inline const QString item = QStringLiteral("Item");
-inline const QString count = QStringLiteral("count");
+inline constexpr QLatin1String item("Item");
+inline constexpr QLatin1String count("count");
 
-inline const QString className = QStringLiteral("class");
-inline const QString id = QStringLiteral("id");
-inline const QString reference = QStringLiteral("ref");
-inline const QString null = QStringLiteral("null");
+inline constexpr QLatin1String className("class");
+inline constexpr QLatin1String id("id");
+inline constexpr QLatin1String reference("ref");
+inline constexpr QLatin1String null("null");
 
-inline const QString x = QStringLiteral("x");
-inline const QString y = QStringLiteral("y");
-inline const QString yes = QStringLiteral("true");
-inline const QString no = QStringLiteral("false");
-inline const QString encoding = QStringLiteral("encoding");
-inline const QString base64 = QStringLiteral("base64");
+inline constexpr QLatin1String x("x");
+inline constexpr QLatin1String y("y");
+inline constexpr QLatin1String yes("true");
+inline constexpr QLatin1String no("false");
+inline constexpr QLatin1String encoding("encoding");
+inline constexpr QLatin1String base64("base64");
 
 } // namespace Serialize::Details::Xml

@@ -16,9 +16,11 @@ namespace {
 void requireTag(const std::string& key)
 {
     const auto isLetter = [](char c) { return (c >= 'A' && c <= 'Z') || (c >= 'a' && c <= 'z') || c == '_'; };
-    const auto isInner = [&](char c) { return isLetter(c) || (c >= '0' && c <= '9') || c == '-' || c == '.'; };
+    const auto isInner = [&](char c) {
+        return isLetter(c) || (c >= '0' && c <= '9') || c == '-' || c == '.';
+    };
     if (key.empty() || !isLetter(key.front()) || !std::all_of(key.begin(), key.end(), isInner))
-        throw std::runtime_error("the key " + quoted(key) + " cannot be a tag");
+        throw std::runtime_error("the key " + inQuotes(key) + " cannot be a tag");
 }
 
 /// What XML cannot hold, and the carriage return, which readers take for a line feed.
