@@ -1,0 +1,43 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "ShowCommand.h"
+
+#include "MediaTable.h"
+
+#include <EditorModel/media/File.h>
+#include <EditorModel/persistence/Document.h>
+
+#include <deque>
+
+namespace Host {
+namespace {
+
+std::deque<const Media::File*> filesOf(const Document::Graph& graph)
+{
+    std::deque<const Media::File*> files;
+    for (const Serialize::ISerializable* root : graph.roots()) {
+        if (const auto* const file = dynamic_cast<const Media::File*>(root)) {
+            files.push_back(file);
+        }
+    }
+    return files;
+}
+
+} // namespace
+
+ExitCode show(const QString& path)
+{
+    try {
+        const Document::Graph graph = Document::loadFile(path);
+        const std::deque<const Media::File*> files = filesOf(graph);
+        if (files.empty()) {
+            writeError(path, "holds no descriptions of media files");
+            return Failure;
+        }
+        return writeOutput(mediaTable(files)) ? Success : Failure;
+    } catch (const Document::Error& error) {
+        writeError(error.what());
+        return Failure;
+    }
+}
+
+} // namespace Host
