@@ -1,0 +1,262 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "Samples.h"
+
+#include <QProcess>
+#include <QProcessEnvironment>
+#include <QStringList>
+
+#include <gmock/gmock.h>
+#include <nlohmann/json.hpp>
+
+#include <algorithm>
+#include <string>
+
+namespace {
+
+using namespace HostTests;
+using testing::AllOf;
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::IsEmpty;
+using testing::Not;
+using testing::StartsWith;
+
+struct Outcome
+{
+    int exitCode;
+    std::string output;
+    std::string errors;
+};
+
+Outcome run(const QString& program, const QStringList& arguments, const QString& folder = QString(),
+            const QString& locale = "C.UTF-8")
+{
+    QProcess process;
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.insert("LC_ALL", locale);
+    process.setProcessEnvironment(environment);
+    process.setWorkingDirectory(folder);
+    process.start(program, arguments);
+    if (!process.waitForFinished(60000) || process.exitStatus() != QProcess::NormalExit) {
+        throw std::runtime_error("the command did not end by itself");
+    }
+    return {process.exitCode(), process.readAllStandardOutput().toStdString(),
+            process.readAllStandardError().toStdString()};
+}
+
+Outcome editormodel(const QStringList& arguments, const QString& folder = QString(),
+                    const QString& locale = "C.UTF-8")
+{
+    return run(EDITORMODEL_COMMAND, arguments, folder, locale);
+}
+
+/// Everything on this test's line may depend on what an encoder makes, but for these words in this order.
+testing::Matcher<std::string> hasLine(const QStringList& words)
+{
+    return testing::ContainsRegex(("(^|\n) *" + words.join("  +") + "[^\n]*\n").toStdString());
+}
+
+TEST(ProbeCommand, PrintsATableOfTheFilesAndTheirTracks)
+{
+    const Outcome outcome = editormodel({"probe", "speech.wav", "picture.png", "tracks.mkv"}, sample(""));
+    EXPECT_EQ(outcome.exitCode, 0);
+    EXPECT_THAT(outcome.errors, IsEmpty());
+    EXPECT_THAT(outcome.output, StartsWith("File         Format"));
+    EXPECT_THAT(outcome.output, hasLine({"speech.wav", "wav", "00:00:01.500", "132.4 kB"}));
+    EXPECT_THAT(outcome.output,
+                hasLine({"#0", "audio", "pcm_s16le", "44100 Hz", "mono", "s16", "706 kbit/s"}));
+    EXPECT_THAT(outcome.output, hasLine({"picture.png", "png", "-"}));
+    EXPECT_THAT(outcome.output, hasLine({"#0", "picture", "png", "64 x 48"}));
+    EXPECT_THAT(outcome.output, hasLine({"tracks.mkv", "matroska"}));
+    EXPECT_THAT(outcome.output, hasLine({"#2", "video", "ffv1", "96 x 64", "10 fps"}));
+    EXPECT_THAT(outcome.output,
+                hasLine({"#4", "audio", "ac3", "48000 Hz", "6 channels", "fltp", "448 kbit/s"}));
+}
+
+TEST(ProbeCommand, DescribesTheOthersWhereSomeFail)
+{
+    const Folder folder;
+    folder.copy("film.mp4", "cut.mp4", 0.5);
+    folder.copy("speech.wav", "good.wav");
+    const Outcome outcome = editormodel({"probe", "cut.mp4", "good.wav", "missing.mp4", "."}, folder.path());
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_THAT(outcome.output, hasLine({"good.wav", "wav", "00:00:01.500", "132.4 kB"}));
+    EXPECT_THAT(outcome.output, Not(HasSubstr("cut.mp4")));
+    EXPECT_EQ(outcome.errors, "cut.mp4: looks like QuickTime / MOV but is damaged or incomplete\n"
+                              "missing.mp4: does not exist\n"
+                              ".: is a folder\n");
+}
+
+TEST(ProbeCommand, PrintsNoTableOfNothing)
+{
+    const Outcome outcome = editormodel({"probe", "/no/such/file"});
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_THAT(outcome.output, IsEmpty());
+    EXPECT_EQ(outcome.errors, "/no/such/file: does not exist\n");
+}
+
+TEST(ProbeCommand, PrintsJsonForOtherPrograms)
+{
+    const Outcome outcome =
+        editormodel({"probe", "--json", "speech.wav", "missing", "wide-pixels-quarter-turn.mov"}, sample(""));
+    EXPECT_EQ(outcome.exitCode, 1);
+    const auto files = nlohmann::json::parse(outcome.output);
+    ASSERT_EQ(files.size(), 3u);
+    EXPECT_EQ(files[0]["path"], "speech.wav");
+    EXPECT_EQ(files[0]["format"], "wav");
+    EXPECT_EQ(files[0]["length"], 1500);
+    EXPECT_EQ(files[0]["size"], contentOf(sample("speech.wav")).size());
+    EXPECT_EQ(files[0]["videoTracks"], nlohmann::json::array());
+    EXPECT_EQ(files[0]["audioTracks"],
+              nlohmann::json::parse(R"([{"index": 0, "codec": "pcm_s16le", "bitrate": 705600, "channels": 1,
+                                         "sampleRate": 44100, "sampleFormat": "s16"}])"));
+    EXPECT_EQ(files[1], nlohmann::json::parse(R"({"path": "missing", "error": "does not exist"})"));
+    const auto& video = files[2]["videoTracks"][0];
+    EXPECT_EQ(video["width"], 144);
+    EXPECT_EQ(video["height"], 180);
+    EXPECT_EQ(video["pixelAspect"], nlohmann::json::parse("[45, 64]"));
+    EXPECT_EQ(video["frameRate"], nlohmann::json::parse("[25, 1]"));
+}
+
+TEST(ProbeCommand, WritesNamesAsUtf8InEveryLocale)
+{
+    const Folder folder;
+    const QString name = QString::fromUtf8("写真 'ä' \"б\".png");
+    folder.copy("picture.png", name);
+    for (const char* locale : {"C", "POSIX", "C.UTF-8"}) {
+        const Outcome outcome = editormodel({"probe", name, "é"}, folder.path(), locale);
+        EXPECT_THAT(outcome.output, HasSubstr("\n" + name.toStdString() + "  png")) << locale;
+        EXPECT_EQ(outcome.errors, "é: does not exist\n") << locale;
+    }
+}
+
+TEST(ProbeCommand, LetsNoNameSteerTheTerminal)
+{
+    const Outcome outcome = editormodel({"probe", "a\nb\x1b[2J"});
+    EXPECT_EQ(outcome.errors, "a\\x0ab\\x1b[2J: does not exist\n");
+}
+
+TEST(ProbeCommand, KeepsTheLibrariesQuietUnlessAskedNotTo)
+{
+    const Folder folder;
+    folder.copy("film.mp4", "cut.mp4", 0.5);
+    EXPECT_THAT(editormodel({"probe", "cut.mp4"}, folder.path()).errors, Not(HasSubstr("moov")));
+    EXPECT_THAT(editormodel({"probe", "--verbose", "cut.mp4"}, folder.path()).errors, HasSubstr("moov"));
+}
+
+TEST(ProbeCommand, FailsWhereItsOutputCannotBeWritten)
+{
+    const Outcome outcome =
+        run("sh", {"-c", "\"$0\" probe speech.wav > /dev/full", EDITORMODEL_COMMAND}, sample(""));
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_EQ(outcome.errors, "standard output: cannot be written\n");
+}
+
+TEST(ProbeCommand, DrawsItsProgressOnATerminalOnly)
+{
+    const QString command = QString(EDITORMODEL_COMMAND) + " probe speech.wav picture.png";
+    EXPECT_THAT(run("sh", {"-c", command}, sample("")).errors, IsEmpty());
+    const Outcome onTerminal = run("script", {"-qec", command, "/dev/null"}, sample(""));
+    EXPECT_EQ(onTerminal.exitCode, 0);
+    EXPECT_THAT(onTerminal.output, HasSubstr("[##########          ]  1/2  picture.png"));
+    EXPECT_THAT(onTerminal.output, HasSubstr("\r\x1b[KFile  "));
+}
+
+TEST(Command, TellsHowItIsUsed)
+{
+    for (const QStringList& wrong :
+         {QStringList(), QStringList("probe"), QStringList("show"), QStringList("nonsense"),
+          QStringList({"probe", "a.wav", "--save", "a.doc"}),
+          QStringList({"probe", "--no-such-option", "a"})}) {
+        const Outcome outcome = editormodel(wrong);
+        EXPECT_EQ(outcome.exitCode, 2) << wrong.join(' ').toStdString();
+        EXPECT_THAT(outcome.output, IsEmpty());
+        EXPECT_THAT(outcome.errors, Not(IsEmpty()));
+    }
+    const Outcome help = editormodel({"--help"});
+    EXPECT_EQ(help.exitCode, 0);
+    EXPECT_THAT(help.output, AllOf(HasSubstr("probe"), HasSubstr("show")));
+}
+
+class SavedDescriptions : public testing::TestWithParam<const char*>
+{};
+
+TEST_P(SavedDescriptions, AreShownInTheTableThatProbePrinted)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("media.") + GetParam());
+    const QStringList files = {"film.mp4", "tracks.mkv", "song.mp3", "picture.png", "film-quarter-turn.mp4"};
+    const Outcome probed = editormodel(QStringList({"probe", "--save", document}) + files, sample(""));
+    ASSERT_EQ(probed.exitCode, 0) << probed.errors;
+
+    const Outcome shown = editormodel({"show", document});
+    EXPECT_EQ(shown.exitCode, 0);
+    EXPECT_THAT(shown.errors, IsEmpty());
+    EXPECT_EQ(shown.output, probed.output);
+}
+
+TEST_P(SavedDescriptions, AreThoseOfTheFilesThatCouldBeOpened)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("media.") + GetParam());
+    const Outcome probed =
+        editormodel({"probe", "speech.wav", "missing.wav", "--save", document}, sample(""));
+    EXPECT_EQ(probed.exitCode, 1);
+    EXPECT_EQ(editormodel({"show", document}).output, probed.output);
+}
+
+TEST_P(SavedDescriptions, AreRefusedInOneLineIfTheyAreDamaged)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("media.") + GetParam());
+    ASSERT_EQ(editormodel({"probe", "speech.wav", "--save", document}, sample("")).exitCode, 0);
+    const QByteArray whole = contentOf(document);
+    folder.write("damaged", whole.left(whole.size() / 2));
+
+    const Outcome shown = editormodel({"show", "damaged"}, folder.path());
+    EXPECT_EQ(shown.exitCode, 1);
+    EXPECT_THAT(shown.output, IsEmpty());
+    EXPECT_THAT(shown.errors, AllOf(HasSubstr("damaged"), EndsWith("\n")));
+    EXPECT_EQ(std::count(shown.errors.begin(), shown.errors.end(), '\n'), 1) << shown.errors;
+}
+
+INSTANTIATE_TEST_SUITE_P(Forms, SavedDescriptions, testing::Values("json", "xml", "bin"),
+                         [](const auto& form) { return std::string(form.param); });
+
+TEST(ShowCommand, TellsInOneLineThatAFileIsNoDocument)
+{
+    const Folder folder;
+    folder.write("empty.json", QByteArray());
+    folder.write("letter.xml", "Dear Sir or Madam,\n");
+    folder.write("other.json", "{\"a\": 1}");
+    folder.copy("film.mp4", "film.bin");
+    for (const char* name : {"empty.json", "letter.xml", "other.json", "film.bin", "missing.json", "."}) {
+        const Outcome shown = editormodel({"show", name}, folder.path());
+        EXPECT_EQ(shown.exitCode, 1) << name;
+        EXPECT_THAT(shown.output, IsEmpty()) << name;
+        EXPECT_THAT(shown.errors, HasSubstr(name));
+        EXPECT_EQ(std::count(shown.errors.begin(), shown.errors.end(), '\n'), 1) << shown.errors;
+    }
+}
+
+TEST(ProbeCommand, TellsWhereADocumentCannotBeWritten)
+{
+    const Outcome outcome =
+        editormodel({"probe", "speech.wav", "--save", "/no/such/folder/media.json"}, sample(""));
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_THAT(outcome.output, hasLine({"speech.wav", "wav"}));
+    EXPECT_THAT(outcome.errors, HasSubstr("/no/such/folder/media.json"));
+    EXPECT_EQ(std::count(outcome.errors.begin(), outcome.errors.end(), '\n'), 1) << outcome.errors;
+}
+
+TEST(ProbeCommand, SavesNothingWhereNothingCouldBeDescribed)
+{
+    const Folder folder;
+    const Outcome outcome = editormodel({"probe", "missing", "--save", "media.json"}, folder.path());
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_EQ(outcome.errors,
+              "missing: does not exist\nmedia.json: is not written: there is nothing to save\n");
+    EXPECT_FALSE(QFile::exists(folder.path("media.json")));
+}
+
+} // namespace
