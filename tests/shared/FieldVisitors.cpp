@@ -138,7 +138,7 @@ void Dump::onPointer(const Serialize::Key& key, const Serialize::PointerField& f
 {
     if (m_muted)
         return;
-    const Serialize::Pointee pointee = field.get(field);
+    const Serialize::Pointee pointee = field.access.get(field);
     if (!pointee.object) {
         line(std::string(key.archive) + ": null");
         return;
@@ -297,7 +297,7 @@ void Filler::onPointer(const Serialize::Key&, const Serialize::PointerField& fie
                 object = made.object;
         }
     }
-    field.set(field, dynamic_cast<void*>(object), object);
+    field.access.setRoot(field, object);
 }
 
 void Filler::onContainer(const Serialize::Key&, const Serialize::Type& type, void* container)

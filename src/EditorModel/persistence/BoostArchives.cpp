@@ -438,7 +438,7 @@ private:
         within(key.archive, [&](Archive& archive) {
             if (field.declared)
                 archive.register_basic_serializer(formsOf(*field.declared).template of<Archive>().object);
-            const Pointee pointee = field.get(field);
+            const Pointee pointee = field.access.get(field);
             if (!pointee.object) {
                 archive.save_null_pointer();
                 ba::save_access::end_preamble(archive);
@@ -552,13 +552,13 @@ private:
             void* object = nullptr;
             const auto* const found = archive.load_pointer(object, declared, &find);
             if (!object) {
-                field.set(field, nullptr, nullptr);
+                field.access.set(field, {nullptr, nullptr});
                 return;
             }
             const Type* const type = findType(typeidOf(found->get_eti()), field.declared);
             if (!type)
                 throwUnregistered();
-            field.set(field, object, type->serializable ? type->serializable(object) : nullptr);
+            field.access.set(field, {object, type});
         });
     }
 

@@ -49,20 +49,28 @@ struct Pointee
     const Type* type;
 };
 
-/// A field that points at a persistent object, or, with no root, at a picture.
-struct PointerField
+struct PointerField;
+
+/// How the pointers of one class are read and set.
+struct PointerAccess
 {
-    /// The class that the field is declared with; null for an abstract one.
-    const Type* declared;
-    void* slot;
     /// The object is null for a null pointer, its type for a class that is not registered.
     Pointee (*get)(const PointerField& field);
     /// The pointer as it goes through the field stream.
     const ISerializable* (*root)(const PointerField& field);
     /// Null is stored as it is. An object of another class than the field's throws `std::bad_cast`, or, where
-    /// the field is `soft`, stores null.
-    /// `object` is the complete object and `root` its persistent root, which a picture has not.
-    void (*set)(const PointerField& field, void* object, ISerializable* root);
+    /// the field is soft, stores null.
+    void (*set)(const PointerField& field, const Pointee& pointee);
+    void (*setRoot)(const PointerField& field, ISerializable* root);
+};
+
+/// A field that points at a persistent object or at a picture.
+struct PointerField
+{
+    const PointerAccess& access;
+    /// The class that the field is declared with; null for an abstract one.
+    const Type* declared;
+    void* slot;
     bool soft;
 };
 
@@ -196,6 +204,48 @@ struct FieldOf<T, std::enable_if_t<isPersistent<T>>>
     }
 };
 
+/// The pointers of a field declared with `Class`.
+template <class Class>
+struct PointersTo
+{
+    static Class*& target(const PointerField& field) { return *static_cast<Class**>(field.slot); }
+
+    static Pointee get(const PointerField& field)
+    {
+        const Class* const object = target(field);
+        return object ? pointee(dynamic_cast<const void*>(object), typeid(*object), field.declared)
+                      : Pointee{nullptr, nullptr};
+    }
+
+    static const ISerializable* root(const PointerField& field) { return target(field); }
+
+    static void set(const PointerField& field, const Pointee& pointee)
+    {
+        if (pointee.object && pointee.type == field.declared)
+            target(field) = static_cast<Class*>(pointee.object);
+        else if (pointee.object && !pointee.type->serializable)
+            refuse(field);
+        else
+            setRoot(field, pointee.object ? pointee.type->serializable(pointee.object) : nullptr);
+    }
+
+    static void setRoot(const PointerField& field, ISerializable* root)
+    {
+        target(field) = dynamic_cast<Class*>(root);
+        if (root && !target(field))
+            refuse(field);
+    }
+
+    static void refuse(const PointerField& field)
+    {
+        target(field) = nullptr;
+        if (!field.soft)
+            throw std::bad_cast();
+    }
+
+    static constexpr PointerAccess access{&get, &root, &set, &setRoot};
+};
+
 template <class T>
 PointerField pointerField(T*& slot, bool soft)
 {
@@ -203,22 +253,7 @@ PointerField pointerField(T*& slot, bool soft)
     const Type* declared = nullptr;
     if constexpr (isPersistent<Class> && !std::is_abstract_v<Class>)
         declared = &Class::persistentType();
-    return PointerField{
-        declared,
-        const_cast<Class**>(&slot),
-        [](const PointerField& field) {
-            const Class* const object = *static_cast<Class**>(field.slot);
-            return object ? pointee(dynamic_cast<const void*>(object), typeid(*object), field.declared)
-                          : Pointee{nullptr, nullptr};
-        },
-        [](const PointerField& field) -> const ISerializable* { return *static_cast<Class**>(field.slot); },
-        [](const PointerField& field, void* object, ISerializable* root) {
-            Class*& target = *static_cast<Class**>(field.slot);
-            target = dynamic_cast<Class*>(root);
-            if (object && !target && !field.soft)
-                throw std::bad_cast();
-        },
-        soft};
+    return PointerField{PointersTo<Class>::access, declared, const_cast<Class**>(&slot), soft};
 }
 
 template <class T>

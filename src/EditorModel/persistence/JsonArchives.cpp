@@ -141,7 +141,7 @@ private:
 
     void onPointer(const Key& key, const PointerField& field) override
     {
-        const Pointee pointee = field.get(field);
+        const Pointee pointee = field.access.get(field);
         within(key.archive, [&] {
             if (!pointee.object)
                 return;
@@ -274,13 +274,6 @@ private:
         std::size_t next;
     };
 
-    /// An object that stands for an identifier.
-    struct Known
-    {
-        void* object;
-        const Type* type;
-    };
-
     /// Notes where each identifier's object stands: the node that has more than its meta node. Walks without
     /// recursion, as nothing bounds the depth of a tree.
     void enterObjects(const json& root)
@@ -386,7 +379,7 @@ private:
             requireObject();
             const auto id = getObjectId(head());
             if (id && type.create)
-                m_known.try_emplace(*id, Known{object, &type});
+                m_known.try_emplace(*id, Pointee{object, &type});
             Details::visit(*this, type, object);
         });
     }
@@ -402,13 +395,11 @@ private:
     void onPointer(const Key& key, const PointerField& field) override
     {
         within(key.archive, [&] {
-            const Known read = head().is_null() ? Known{nullptr, nullptr} : readObject();
-            const bool hasRoot = read.type && read.type->serializable;
-            field.set(field, read.object, hasRoot ? read.type->serializable(read.object) : nullptr);
+            field.access.set(field, head().is_null() ? Pointee{nullptr, nullptr} : readObject());
         });
     }
 
-    Known readObject()
+    Pointee readObject()
     {
         requireObject();
         const auto id = getObjectId(head());
@@ -418,7 +409,7 @@ private:
                 return known->second;
         }
         const Type& type = typeOfHead();
-        const Known made{Details::ConstructionLog::make(type), &type};
+        const Pointee made{Details::ConstructionLog::make(type), &type};
         if (id)
             m_known.emplace(*id, made);
         Details::visit(*this, type, made.object);
@@ -499,7 +490,7 @@ private:
 
     std::vector<Head> m_heads;
     std::unordered_map<std::size_t, const json*> m_nodes;
-    std::unordered_map<std::size_t, Known> m_known;
+    std::unordered_map<std::size_t, Pointee> m_known;
     std::unordered_map<const Types::Image*, std::shared_ptr<const Types::Image>> m_pictures;
     std::size_t m_budget = 0;
 };

@@ -46,11 +46,11 @@ private:
 
     void onPointer(const Key&, const PointerField& field) override
     {
-        const Pointee pointee = field.get(field);
+        const Pointee pointee = field.access.get(field);
         Record& record = m_records[pointee.object];
         if (record.kind == NotSeen) {
             record.kind = ByPointer;
-            const ISerializable* const root = field.root(field);
+            const ISerializable* const root = field.access.root(field);
             record.deleter = [root] { delete root; };
         }
         if (pointee.object && !pointee.type)

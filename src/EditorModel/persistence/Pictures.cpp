@@ -65,25 +65,31 @@ void destroyPicture(void* object)
     delete static_cast<Types::Image*>(object);
 }
 
+Types::Image*& picture(const PointerField& field)
+{
+    return *static_cast<Types::Image**>(field.slot);
+}
+
+constexpr PointerAccess pictureAccess{
+    [](const PointerField& field) {
+        return Pointee{picture(field), &pictureType()};
+    },
+    [](const PointerField&) -> const ISerializable* { return nullptr; },
+    [](const PointerField& field, const Pointee& read) {
+        if (read.object && read.type != &pictureType())
+            throw std::bad_cast();
+        picture(field) = static_cast<Types::Image*>(read.object);
+    },
+    [](const PointerField&, ISerializable*) { throw std::bad_cast(); },
+};
+
 void visitShared(Fields& fields, void* object)
 {
     auto& shared = *static_cast<std::shared_ptr<const Types::Image>*>(object);
-    auto* picture = const_cast<Types::Image*>(shared.get());
-    const PointerField field{&pictureType(),
-                             &picture,
-                             [](const PointerField& slot) {
-                                 return Pointee{*static_cast<Types::Image**>(slot.slot), &pictureType()};
-                             },
-                             [](const PointerField&) -> const ISerializable* { return nullptr; },
-                             [](const PointerField& slot, void* read, ISerializable* root) {
-                                 if (root)
-                                     throw std::bad_cast();
-                                 *static_cast<Types::Image**>(slot.slot) = static_cast<Types::Image*>(read);
-                             },
-                             false};
-    fields.pointer("px", field);
+    auto* image = const_cast<Types::Image*>(shared.get());
+    fields.pointer("px", PointerField{pictureAccess, &pictureType(), &image, false});
     if (fields.loading())
-        shared = picture ? fields.share(picture) : nullptr;
+        shared = image ? fields.share(image) : nullptr;
 }
 
 } // namespace

@@ -86,7 +86,7 @@ private:
     void onPointer(const Key& key, const PointerField& field) override
     {
         m_stream.field({key.stream, field.slot});
-        m_route.writePointer(field.root(field));
+        m_route.writePointer(field.access.root(field));
     }
 };
 
@@ -113,7 +113,7 @@ private:
         m_stream.field({key.stream, field.slot});
         ISerializable* object = nullptr;
         m_route.readPointer(object);
-        field.set(field, dynamic_cast<void*>(object), object);
+        field.access.setRoot(field, object);
     }
 };
 
