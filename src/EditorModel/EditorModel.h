@@ -18,12 +18,14 @@
 #include <EditorModel/media/Object.h>
 #include <EditorModel/media/Video.h>
 #include <EditorModel/media/Views.h>
+#include <EditorModel/persistence/Document.h>
 #include <EditorModel/persistence/FieldArchive.h>
 #include <EditorModel/persistence/Fields.h>
 #include <EditorModel/persistence/Persistent.h>
 #include <EditorModel/persistence/Serializable.h>
 #include <EditorModel/persistence/Serializer.h>
 #include <EditorModel/persistence/Type.h>
+#include <EditorModel/persistence/streams/Streams.h>
 #include <EditorModel/services/AppEvents.h>
 #include <EditorModel/services/Command.h>
 #include <EditorModel/services/Report.h>
