@@ -180,6 +180,18 @@ TEST_F(ViewTest, AViewThatEndsTellsNobody)
     EXPECT_THAT(client.enumerateAll(), IsEmpty());
 }
 
+TEST_F(ViewTest, AViewMayOutliveItsObjects)
+{
+    TracedView view(trace, "view");
+    auto note = std::make_unique<Note>();
+    auto other = std::make_unique<Note>();
+    view.own(note.get());
+    view.observe(other.get());
+    note.reset();
+    other.reset();
+    EXPECT_EQ(view.objects().size(), 2u);
+}
+
 TEST_F(ViewTest, NullIsIgnoredWhereItHasNoMeaning)
 {
     TracedView view(trace, "view");

@@ -14,7 +14,6 @@ quint64 MessageTable::registerSubscriber(void* subscriber, const SubscriberBase&
 void MessageTable::unregisterSubscriber(const void* subscriber)
 {
     m_registrations.remove(subscriber);
-    ++m_state.removals;
 }
 
 void MessageTable::subscribe(const Recipient& recipient, const Object* object)
@@ -56,6 +55,7 @@ RecipientList& MessageTable::all(const std::type_index& objectType)
     return *m_byType.emplace_back(objectType, std::make_unique<RecipientList>()).second;
 }
 
+/// The way to a single recipient or to none calls nothing.
 Snapshot MessageTable::snapshot(const Object* sender, const RecipientList& all)
 {
     const RecipientList* some = m_bySender.find(sender);
@@ -63,11 +63,16 @@ Snapshot MessageTable::snapshot(const Object* sender, const RecipientList& all)
         return snapshotOfBoth(sender, *some, all);
     }
     const RecipientList& recipients = some ? *some : all;
-    const std::size_t count = recipients.size();
-    if (count > 1) {
-        push(recipients);
+    if (recipients.isLong()) {
+        return snapshotOfOne(recipients);
     }
-    return {recipients.first().subscriber, count};
+    return {recipients.first().subscriber, recipients.isEmpty() ? 0u : 1u};
+}
+
+Snapshot MessageTable::snapshotOfOne(const RecipientList& recipients)
+{
+    push(recipients);
+    return {recipients.first().subscriber, recipients.size()};
 }
 
 /// Somebody who is in both lists is reached once.

@@ -11,11 +11,7 @@
 
 namespace PubSub {
 
-Object::~Object() = default;
-
 namespace Details {
-
-MessageBase::~MessageBase() = default;
 
 namespace {
 

@@ -25,7 +25,7 @@ public:
     Object() = default;
     Object(const Object&) {}
     Object& operator=(const Object&) { return *this; }
-    virtual ~Object();
+    virtual ~Object() = default;
 };
 
 namespace Details {
@@ -41,7 +41,7 @@ public:
     MessageBase() = default;
     MessageBase(const MessageBase&) = default;
     MessageBase& operator=(const MessageBase&) = default;
-    virtual ~MessageBase();
+    virtual ~MessageBase() = default;
 };
 
 } // namespace Details

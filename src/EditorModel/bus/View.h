@@ -35,7 +35,7 @@ public:
     /// The copy owns and observes what the other does. No callback runs.
     View(const View& other);
     View& operator=(const View&) = delete;
-    /// Forgets all objects and publishes nothing: objects that were owned here have no owner then.
+    /// Lets go of all objects and publishes nothing: objects that were owned here have no owner then.
     virtual ~View();
 
     /// Asks, at the end of the chain, whoever accepts adds to own the object. The chain's setters act on the

@@ -16,7 +16,7 @@ public:
 
     /// Returns the serial number of the registration.
     quint64 registerSubscriber(void* subscriber, const SubscriberBase& base);
-    /// The subscriber must have been left out of all lists before.
+    /// The subscriber has left all lists before, which is what running publications take note of.
     void unregisterSubscriber(const void* subscriber);
 
     void subscribe(const Recipient& recipient, const Object* object);
@@ -37,6 +37,7 @@ private:
         const SubscriberBase* base = nullptr;
     };
 
+    Snapshot snapshotOfOne(const RecipientList& recipients);
     Snapshot snapshotOfBoth(const Object* sender, const RecipientList& some, const RecipientList& all);
     void push(const RecipientList& recipients);
     void reserve(std::size_t count);

@@ -16,6 +16,8 @@ class RecipientList
 public:
     std::size_t size() const { return m_first.subscriber ? 1 + m_rest.size() : 0; }
     bool isEmpty() const { return !m_first.subscriber; }
+    /// Has more than one.
+    bool isLong() const { return !m_rest.empty(); }
     const Recipient& first() const { return m_first; }
 
     /// Writes size() entries; the list must not be empty.
