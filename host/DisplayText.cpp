@@ -84,7 +84,7 @@ int displayWidth(const std::string& text)
 
 std::string elided(const QString& text, int width)
 {
-    const std::string whole = printable(text);
+    std::string whole = printable(text);
     if (displayWidth(whole) <= width) {
         return whole;
     }

@@ -124,7 +124,7 @@ Recognition recognise(AVIOContext& file, const QByteArray& name)
 AVFormatContext* openContext(AVIOContext& file, const Recognition& recognition, const QString& path)
 {
     Options options;
-    // A playlist must not lead out of the machine.
+    // A playlist may name other files, but must not lead out of the machine.
     av_dict_set(&options.entries, "protocol_whitelist", "file", 0);
     AVFormatContext* context = avformat_alloc_context();
     if (!context) {

@@ -24,7 +24,8 @@ public:
     const QString reason;
 };
 
-/// A media file opened with FFmpeg, with the formats of its streams known. It reads nothing but the one file.
+/// A media file opened with FFmpeg, with the formats of its streams known. Nothing is read over a network,
+/// also not where the file is a playlist.
 class MediaInput
 {
 public:

@@ -68,12 +68,22 @@ bool isOpaque(int pixelFormat)
     return !format || (format->flags & AV_PIX_FMT_FLAG_ALPHA) == 0;
 }
 
+int bitrateOf(const AVCodecParameters& codec)
+{
+    // MPEG-1 has this highest value, in units of 400 bit/s, for a rate that varies.
+    const std::int64_t varies = std::int64_t(0x3ffff) * 400;
+    if (codec.codec_id == AV_CODEC_ID_MPEG1VIDEO && codec.bit_rate == varies) {
+        return 0;
+    }
+    const std::int64_t highest = std::numeric_limits<int>::max();
+    return static_cast<int>(std::clamp<std::int64_t>(codec.bit_rate, 0, highest));
+}
+
 void describeTrack(const AVStream& stream, Media::File::Track& track)
 {
-    const std::int64_t highest = std::numeric_limits<int>::max();
     track.index = stream.index;
     track.codecId = codecName(*stream.codecpar);
-    track.bitrate = static_cast<int>(std::clamp<std::int64_t>(stream.codecpar->bit_rate, 0, highest));
+    track.bitrate = bitrateOf(*stream.codecpar);
 }
 
 VideoTrack describeVideo(const MediaInput& input, AVStream& stream)

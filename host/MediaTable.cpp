@@ -60,6 +60,7 @@ std::vector<Row> trackRows(const Media::File& file)
     std::stable_sort(numbered.begin(), numbered.end(),
                      [](const auto& a, const auto& b) { return a.first < b.first; });
     std::vector<Row> rows;
+    rows.reserve(numbered.size());
     for (auto& entry : numbered) {
         rows.push_back(std::move(entry.second));
     }

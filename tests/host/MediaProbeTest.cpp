@@ -127,6 +127,13 @@ TEST_F(MediaProbe, KeepsTheFrameRateAsAFraction)
     EXPECT_EQ(cinema.length, MTime(2002));
 }
 
+TEST_F(MediaProbe, KnowsNoBitrateOfVideoWhoseRateVaries)
+{
+    const auto video = describe(sample("variable-rate.mpg")).videoTracks.at(0);
+    EXPECT_EQ(video.codecId, "mpeg1video");
+    EXPECT_EQ(video.bitrate, 0);
+}
+
 TEST_F(MediaProbe, ListsTheTracksOfEachKindInTheOrderOfTheFile)
 {
     const Host::MediaDescription tracks = describe(sample("tracks.mkv"));

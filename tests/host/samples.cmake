@@ -32,6 +32,7 @@ file(MAKE_DIRECTORY "${FOLDER}")
 picture_source(picture 320x240 25)
 sound_source(sound 48000 stereo)
 sample(film.mp4 ${picture} ${sound} -t 2 -c:v mpeg4 -c:a aac -b:a 96k)
+sample(variable-rate.mpg ${picture} -t 1 -c:v mpeg1video)
 sample(long.mkv ${picture} ${sound} -t 4 -c:v mpeg4 -b:v 400k -c:a pcm_s16le)
 
 turned(film-quarter-turn.mp4 90 film.mp4)
