@@ -254,7 +254,7 @@ protected:
     const std::unique_ptr<Serialize::StreamWriter> m_writer =
         Serialize::makeStreamWriter(GetParam(), m_buffer);
     int m_number = 0;
-    const Leaf m_leaf;
+    const Leaf m_leaf{};
 };
 
 INSTANTIATE_TEST_SUITE_P(Forms, Calls, testing::Values(Document::Binary, Document::Xml, Document::Json),

@@ -8,8 +8,6 @@
 #include <QBuffer>
 #include <QFile>
 
-#include <random>
-
 using namespace StreamTest;
 using testing::HasSubstr;
 
@@ -98,61 +96,6 @@ QByteArray richDocument(Document::Form form)
     grove.notes = {{"key", "value"}};
     grove.list = {&leaf};
     return saved(form, tree);
-}
-
-/// Loads the document; where that works, all of it is walked through and must be as good as any other.
-void expectSoundOrRefused(Document::Form form, const QByteArray& document)
-{
-    const Serialize::Details::ConstructionLog log;
-    Serialize::ISerializable* root = nullptr;
-    try {
-        const auto reader = Serialize::makeStreamReader(form, document);
-        reader->stream().field({"root", nullptr});
-        reader->readPointer(root);
-        reader->finish();
-    } catch (const std::exception& error) {
-        EXPECT_STRNE(error.what(), "");
-        return;
-    }
-    // Bytes that only the binary form can hold may have come in, and a value behind its pointer.
-    try {
-        const Loaded again(Document::Binary, saved(Document::Binary, {root}));
-    } catch (const std::runtime_error& error) {
-        EXPECT_THAT(error.what(), HasSubstr("is held by value"));
-    }
-}
-
-QByteArray damaged(QByteArray document, std::mt19937& random)
-{
-    const auto below = [&random](int limit) {
-        return static_cast<int>(random() % static_cast<unsigned>(limit));
-    };
-    for (int changes = 1 + below(3); changes > 0 && !document.isEmpty(); --changes) {
-        const int place = below(document.size());
-        const char byte = static_cast<char>(below(256));
-        switch (below(6)) {
-        case 0:
-            document[place] = byte;
-            break;
-        case 1:
-            document[place] = static_cast<char>(document[place] ^ (1 << below(8)));
-            break;
-        case 2:
-            document.insert(place, byte);
-            break;
-        case 3:
-            document.remove(place, 1 + below(4));
-            break;
-        case 4:
-            // What stands elsewhere is more likely to mean something here.
-            document[place] = document[below(document.size())];
-            break;
-        default:
-            document.insert(place, document.mid(below(document.size()), 1 + below(40)));
-            break;
-        }
-    }
-    return document;
 }
 
 /// Takes `room` bytes and then no more.

@@ -89,6 +89,17 @@ TEST_P(StreamsWithPictures, RefuseDataThatIsNoPicture)
     EXPECT_EQ(failureOf(GetParam(), document).text, "the data of a picture is no picture");
 }
 
+TEST_P(StreamsWithPictures, WithstandRandomDamage)
+{
+    Album album;
+    album.cover = picture();
+    album.back = album.cover;
+    const QByteArray document = saved(GetParam(), album);
+    std::mt19937 random(11);
+    for (int round = 0; round < 3000; ++round)
+        expectSoundOrRefused(GetParam(), damaged(document, random));
+}
+
 TEST_P(Streams, RefusePicturesWithoutAnApplication)
 {
     QByteArray document;

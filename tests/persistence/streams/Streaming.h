@@ -9,6 +9,7 @@
 #include <gmock/gmock.h>
 
 #include <initializer_list>
+#include <random>
 #include <string>
 #include <vector>
 
@@ -44,6 +45,12 @@ struct Failure
     std::string position;
 };
 Failure failureOf(Document::Form form, const QByteArray& document);
+
+/// Loads the document; where that works, all of it is walked through and must be as good as any other.
+void expectSoundOrRefused(Document::Form form, const QByteArray& document);
+
+/// The document with a few bytes changed, inserted, removed or repeated elsewhere.
+QByteArray damaged(QByteArray document, std::mt19937& random);
 
 std::string nameOf(const testing::TestParamInfo<Document::Form>& form);
 

@@ -222,6 +222,17 @@ TEST_P(Streams, GiveBackEveryCharacterOfTheFirstPlane)
     EXPECT_EQ(copied(grove).words, grove.words);
 }
 
+TEST_P(Streams, PutASubstituteForHalfACharacter)
+{
+    Leaf leaf;
+    leaf.text = QString("a") + QChar(0xD800) + "b";
+    const QString text = copied(leaf).text;
+    ASSERT_EQ(text.size(), 3);
+    EXPECT_EQ(text.front(), QChar('a'));
+    EXPECT_FALSE(text[1].isSurrogate());
+    EXPECT_EQ(text.back(), QChar('b'));
+}
+
 TEST_P(Streams, GiveBackLongTexts)
 {
     Tree tree;

@@ -12,7 +12,8 @@ class ISerializable;
 
 namespace Details {
 
-/// Who an object is. The address alone does not tell: one that is gone may have left it to one of another class.
+/// Who an object is. The address alone does not tell: one that is gone may have left it to one of another
+/// class.
 struct Identity
 {
     const void* address = nullptr;
