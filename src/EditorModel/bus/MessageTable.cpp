@@ -24,14 +24,10 @@ void MessageTable::subscribe(const Recipient& recipient, const Object* object)
 void MessageTable::unsubscribe(const Recipient& recipient, const Object* object)
 {
     ++m_state.removals;
-    RecipientList* recipients = m_bySender.find(object);
-    if (!recipients) {
-        return;
-    }
-    recipients->remove(recipient.subscriber);
-    if (recipients->isEmpty()) {
-        m_bySender.remove(object);
-    }
+    m_bySender.removeIf(object, [&](RecipientList& recipients) {
+        recipients.remove(recipient.subscriber);
+        return recipients.isEmpty();
+    });
 }
 
 void MessageTable::subscribeAll(const Recipient& recipient, const std::type_index& objectType)

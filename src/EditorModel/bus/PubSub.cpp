@@ -104,10 +104,9 @@ SubscriberBase::~SubscriberBase()
 
 void SubscriberBase::subscribe(const Object* object)
 {
-    if (!object || isSubscribed(object)) {
+    if (!object || !m_subscriptions->objects.insert(object)) {
         return;
     }
-    m_subscriptions->objects.add(object);
     try {
         for (const Registration& registration : m_subscriptions->registrations) {
             registration.table->subscribe(registration.recipient, object);

@@ -8,26 +8,26 @@ namespace {
 constexpr std::size_t searchable = 16;
 } // namespace
 
-void RecipientList::add(const Recipient& recipient)
+void RecipientList::addToRest(const Recipient& recipient)
 {
-    append(recipient);
+    m_rest.push_back(recipient);
     try {
         index();
     } catch (...) {
-        removeLast();
+        m_rest.pop_back();
         throw;
     }
 }
 
-void RecipientList::remove(const void* subscriber)
+void RecipientList::removeFromMany(const void* subscriber)
 {
     const std::size_t found = position(subscriber);
     if (found == size()) {
         return;
     }
-    const Recipient last = at(size() - 1);
+    const Recipient last = m_rest.back();
     at(found) = last;
-    removeLast();
+    m_rest.pop_back();
     if (m_positions && size() <= searchable / 2) {
         m_positions.reset();
     } else if (m_positions) {
@@ -61,24 +61,6 @@ void RecipientList::index()
             positions->add(at(i).subscriber) = i;
         }
         m_positions = std::move(positions);
-    }
-}
-
-void RecipientList::append(const Recipient& recipient)
-{
-    if (isEmpty()) {
-        m_first = recipient;
-    } else {
-        m_rest.push_back(recipient);
-    }
-}
-
-void RecipientList::removeLast()
-{
-    if (m_rest.empty()) {
-        m_first = {nullptr, 0};
-    } else {
-        m_rest.pop_back();
     }
 }
 

@@ -33,26 +33,30 @@ public:
     }
 
     /// The value of the key, default-constructed if the key is new.
-    Value& add(const void* key)
+    Value& add(const void* key) { return m_slots[enter(key)].value; }
+
+    /// False if the key was there.
+    bool insert(const void* key)
     {
-        if ((m_size + 1) * 2 > m_capacity) {
-            rehash(m_capacity ? m_capacity * 2 : minimum);
-        }
-        Slot& slot = m_slots[position(key)];
-        if (!slot.key) {
-            slot.key = key;
-            ++m_size;
-        }
-        return slot.value;
+        const std::size_t before = m_size;
+        enter(key);
+        return m_size != before;
     }
 
     bool remove(const void* key)
+    {
+        return removeIf(key, [](const Value&) { return true; });
+    }
+
+    /// Removes the entry of the key if there is one and done(value), which may change it, says so.
+    template <typename Done>
+    bool removeIf(const void* key, Done done)
     {
         if (m_size == 0) {
             return false;
         }
         const std::size_t found = position(key);
-        if (!m_slots[found].key) {
+        if (!m_slots[found].key || !done(m_slots[found].value)) {
             return false;
         }
         closeGap(found);
@@ -96,6 +100,19 @@ private:
         std::size_t i = home(key);
         while (m_slots[i].key && m_slots[i].key != key) {
             i = (i + 1) & (m_capacity - 1);
+        }
+        return i;
+    }
+
+    std::size_t enter(const void* key)
+    {
+        if ((m_size + 1) * 2 > m_capacity) {
+            rehash(m_capacity ? m_capacity * 2 : minimum);
+        }
+        const std::size_t i = position(key);
+        if (!m_slots[i].key) {
+            m_slots[i].key = key;
+            ++m_size;
         }
         return i;
     }

@@ -37,16 +37,31 @@ public:
     }
 
     /// The recipient must not be in the list.
-    void add(const Recipient& recipient);
+    void add(const Recipient& recipient)
+    {
+        if (isEmpty()) {
+            m_first = recipient;
+        } else {
+            addToRest(recipient);
+        }
+    }
+
     /// A subscriber that is not in the list is ignored.
-    void remove(const void* subscriber);
+    void remove(const void* subscriber)
+    {
+        if (isLong()) {
+            removeFromMany(subscriber);
+        } else if (m_first.subscriber == subscriber) {
+            m_first = {nullptr, 0};
+        }
+    }
 
 private:
     Recipient& at(std::size_t position) { return position ? m_rest[position - 1] : m_first; }
     std::size_t position(const void* subscriber);
+    void addToRest(const Recipient& recipient);
+    void removeFromMany(const void* subscriber);
     void index();
-    void append(const Recipient& recipient);
-    void removeLast();
 
     Recipient m_first{nullptr, 0};
     std::vector<Recipient> m_rest;
