@@ -224,9 +224,11 @@ json treeByHand(const ByHand::Content& content)
             const auto entered = ids.try_emplace(record, lastId + 1);
             json& meta = node["$meta"];
             meta["class"] = "Bench::Record";
-            meta["id"] = entered.first->second;
-            if (!entered.second)
+            if (!entered.second) {
+                meta["ref"] = entered.first->second;
                 return node;
+            }
+            meta["id"] = entered.first->second;
             ++lastId;
             node["index"] = record->index;
             node["enabled"] = record->enabled;
@@ -264,10 +266,11 @@ ByHand::Content* readByHand(const json& root)
         {
             if (node.is_null())
                 return nullptr;
-            const int id = node.at("$meta").at("id").get<int>();
-            const auto found = known.find(id);
-            if (found != known.end())
-                return found->second;
+            const json& meta = node.at("$meta");
+            const auto reference = meta.find("ref");
+            if (reference != meta.end())
+                return known.at(reference->get<int>());
+            const int id = meta.at("id").get<int>();
             auto* const record = new ByHand::Record;
             known.emplace(id, record);
             record->index = node.at("index").get<int>();

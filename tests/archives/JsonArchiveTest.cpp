@@ -81,7 +81,7 @@ TEST(JsonArchive, APointerNamesItsClassAndEveryLaterMentionItsIdentity)
     EXPECT_EQ(saved(leaves), json::parse(R"({"content": {"count": 3, "item_version": 0, "item": [
         {"$meta": {"class": "Sample::Leaf", "id": 1}, "number": 4, "text": "four"},
         null,
-        {"$meta": {"class": "Sample::Leaf", "id": 1}}]}})"));
+        {"$meta": {"class": "Sample::Leaf", "ref": 1}}]}})"));
 }
 
 TEST(JsonArchive, AnObjectHeldByValueGetsAnIdentityWhenAPointerNamesIt)
@@ -90,7 +90,7 @@ TEST(JsonArchive, AnObjectHeldByValueGetsAnIdentityWhenAPointerNamesIt)
     tree.other = &tree;
     const json root = saved(tree);
     EXPECT_EQ(root["content"]["$meta"], json::parse(R"({"id": 1})"));
-    EXPECT_EQ(root["content"]["other"], json::parse(R"({"$meta": {"class": "Sample::Tree", "id": 1}})"));
+    EXPECT_EQ(root["content"]["other"], json::parse(R"({"$meta": {"class": "Sample::Tree", "ref": 1}})"));
     EXPECT_FALSE(root["content"]["inner"].contains("$meta"));
 }
 
@@ -157,24 +157,31 @@ TEST(JsonArchive, BytesAreBase64)
 
 TEST(JsonArchive, AnIdentifierThatIsNotInTheTableThrows)
 {
-    // A node that names an identity is always in the table itself; what is missing there can only come from a
-    // node that was not part of the tree when the archive began.
-    json root = json::parse(R"({"content": {"number": 1, "text": ""}})");
-    iarchive archive(root);
-    root["content"]["$meta"]["id"] = 5;
+    const json root = json::parse(R"({"content": {"$meta": {"class": "Sample::Leaf", "ref": 5}}})");
+    const Sample::Leaf* pointer = nullptr;
+    EXPECT_EQ(errorOf(root, pointer), "invalid map<K, T> key");
     Sample::Leaf leaf;
-    try {
-        archive >> make_nvp("content", leaf);
-        FAIL() << "an unknown identifier was read";
-    } catch (const std::out_of_range& error) {
-        EXPECT_STREQ(error.what(), "invalid map<K, T> key");
-    }
+    EXPECT_THROW(load(root, leaf), std::out_of_range);
+}
+
+TEST(JsonArchive, AnObjectHeldByValueTwiceIsCopiedFromItsMention)
+{
+    const Sample::Leaf leaf(4, QStringLiteral("four"));
+    json root;
+    oarchive(root) << make_nvp("first", leaf) << make_nvp("second", leaf);
+    EXPECT_EQ(root["second"], json::parse(R"({"$meta": {"ref": 1}})"));
+    Sample::Leaf first;
+    Sample::Leaf second;
+    iarchive archive(root);
+    archive >> make_nvp("first", first) >> make_nvp("second", second);
+    EXPECT_EQ(first.number, 4);
+    EXPECT_EQ(second.number, 4);
 }
 
 TEST(JsonArchive, AMentionMayStandBeforeWhatItNames)
 {
     const json root = json::parse(R"({"content": {"count": 2, "item_version": 0, "item": [
-        {"$meta": {"class": "Sample::Leaf", "id": 9}},
+        {"$meta": {"class": "Sample::Leaf", "ref": 9}},
         {"$meta": {"class": "Sample::Leaf", "id": 9}, "number": 4, "text": "four"}]}})");
     std::deque<const Sample::Leaf*> leaves;
     load(root, leaves);
@@ -258,7 +265,7 @@ TEST(JsonArchive, ADocumentThatRepeatsItsOwnPartsIsRefused)
             items.push_back(item);
         return json{{"count", times}, {"item_version", 0}, {"item", items}};
     };
-    const auto mention = [](int id) { return json{{"$meta", {{"id", id}}}}; };
+    const auto mention = [](int id) { return json{{"$meta", {{"ref", id}}}}; };
     json leaf = {{"number", 1}, {"text", "x"}, {"$meta", {{"id", 1}}}};
     json root;
     for (int level = 1; level <= 4; ++level) {
@@ -275,7 +282,7 @@ TEST(JsonArchive, ADocumentThatRepeatsItsOwnPartsIsRefused)
 TEST(JsonArchive, AnObjectThatHoldsItselfByValueIsRefused)
 {
     const json root = json::parse(R"({"content": {"$meta": {"id": 1}, "count": 1, "item_version": 0,
-        "item": [{"$meta": {"id": 1}}]}})");
+        "item": [{"$meta": {"ref": 1}}]}})");
     std::deque<std::deque<Sample::Leaf>> lists;
     EXPECT_EQ(errorOf(root, lists), "\"number\" is missing");
 }

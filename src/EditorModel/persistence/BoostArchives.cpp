@@ -267,6 +267,7 @@ public:
     {
         recursive_register(true);
     }
+    ~Caster() override { recursive_unregister(); }
 
     void const* upcast(void const* const object) const override { return m_up(object); }
     void const* downcast(void const* const object) const override { return m_down(object); }
@@ -639,7 +640,9 @@ void enterForms(const Type& type)
 
 CastEntry::CastEntry(const Type& derived, const std::type_info& base, Cast up, Cast down)
 {
-    new Caster(formsOf(derived).info, bareInfo(base), up, down);
+    // Boost takes what it makes for a cast back when the cast leaves its table, so they leave it at the end.
+    static std::vector<std::unique_ptr<Caster>> casters;
+    casters.push_back(std::make_unique<Caster>(formsOf(derived).info, bareInfo(base), up, down));
 }
 
 void writeBinaryArchive(std::ostream& stream, Roots& roots)

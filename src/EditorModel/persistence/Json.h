@@ -17,11 +17,14 @@ namespace Serialize::Json {
 namespace MetaDetails {
 EDITORMODEL_EXPORT extern const std::string s_meta;
 EDITORMODEL_EXPORT extern const std::string s_class_name;
-/// The identity of an object, a number; every node that has it stands for the same object.
+/// The identity of an object, a number, in the node that it stands in.
 EDITORMODEL_EXPORT extern const std::string s_id;
+/// The identity of an object that stands elsewhere.
+EDITORMODEL_EXPORT extern const std::string s_reference;
 } // namespace MetaDetails
 
-/// The identifier that a node's meta node gives, if it has one.
+/// The identity that a node's meta node gives, if it does: that of the object in it or of one that it
+/// mentions.
 EDITORMODEL_EXPORT std::optional<std::size_t> getObjectId(const nlohmann::json& node);
 
 namespace detail {
@@ -82,7 +85,7 @@ private:
 class EDITORMODEL_EXPORT iarchive : public Details::FieldArchive<iarchive, false>
 {
 public:
-    /// Reads a tree that outlives the archive. Throws where one identifier stands for two objects.
+    /// Reads a tree that outlives the archive.
     explicit iarchive(const nlohmann::json& root);
     ~iarchive();
     iarchive(const iarchive&) = delete;

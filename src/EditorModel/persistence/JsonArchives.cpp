@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/persistence/ConstructionLog.h>
 #include <EditorModel/persistence/Json.h>
+#include <EditorModel/persistence/JsonIdentity.h>
 #include <EditorModel/persistence/Pictures.h>
 #include <EditorModel/persistence/Unregistered.h>
 #include <EditorModel/persistence/Utf8.h>
@@ -17,6 +18,7 @@ namespace {
 using MetaDetails::s_class_name;
 using MetaDetails::s_id;
 using MetaDetails::s_meta;
+using MetaDetails::s_reference;
 using nlohmann::json;
 
 constexpr const char* countKey = "count";
@@ -127,7 +129,7 @@ private:
             if (entered.second)
                 Details::visit(*this, type, object);
             else
-                head()[s_meta][s_id] = idOf(entered.first->second);
+                head()[s_meta][s_reference] = idOf(entered.first->second);
         });
     }
 
@@ -150,9 +152,11 @@ private:
             head()[s_meta][s_class_name] = pointee.type->name;
             const auto entered =
                 m_places.try_emplace(Identity{pointee.object, pointee.type}, Place{membersOfHead(), 0});
-            head()[s_meta][s_id] = idOf(entered.first->second);
+            const std::size_t id = idOf(entered.first->second);
             if (entered.second)
                 Details::visit(*this, *pointee.type, pointee.object);
+            else
+                head()[s_meta][s_reference] = id;
         });
     }
 
@@ -246,18 +250,18 @@ void oarchive::number(double& value)
 class iarchive::Reader final : public Fields
 {
 public:
-    explicit Reader(const json& root) : Fields(true)
-    {
-        enterObjects(root);
-        m_heads.push_back({&root, 0});
-    }
+    explicit Reader(const json& root) : Fields(true), m_root(root) { push(root); }
 
     const json& head() const { return *m_heads.back().node; }
 
+    /// What is read next is the node under the key, or the object that it mentions.
     void begin(const char* key)
     {
-        if (key)
-            m_heads.push_back({&meant(under(key)), 0});
+        if (!key)
+            return;
+        push(under(key));
+        if (m_heads.back().mentions)
+            resolve();
     }
 
     void end(const char* key)
@@ -267,46 +271,68 @@ public:
     }
 
 private:
-    /// A node that is being read, and how many of the items that share its key are read.
+    /// A node that is being read, how many of the items that share its key are read, and the identity in it.
     struct Head
     {
         const json* node;
         std::size_t next;
+        std::optional<std::size_t> id;
+        bool mentions;
     };
 
-    /// Notes where each identifier's object stands: the node that has more than its meta node. Walks without
-    /// recursion, as nothing bounds the depth of a tree.
-    void enterObjects(const json& root)
+    /// An object that was read, with the node that it stands in.
+    struct Known
     {
-        std::vector<const json*> pending{&root};
+        Pointee object;
+        const json* node;
+    };
+
+    void push(const json& node)
+    {
+        const auto reference = identityIn(node, s_reference);
+        m_heads.push_back({&node, 0, reference ? reference : identityIn(node, s_id), reference.has_value()});
+    }
+
+    /// Goes on with the node that a mention names.
+    void resolve()
+    {
+        if (!m_isEntered)
+            enterObjects();
+        m_heads.back().node = Types::strictAt(m_nodes, *m_heads.back().id);
+    }
+
+    /// Notes where each object stands. Only a document that mentions an object before it, or holds it by
+    /// value twice, needs this: elsewhere every mention is of an object that was read. Walks without
+    /// recursion, as nothing bounds the depth of a tree.
+    void enterObjects()
+    {
+        m_isEntered = true;
+        std::size_t count = 0;
+        std::vector<const json*> pending{&m_root};
         while (!pending.empty()) {
             const json& node = *pending.back();
             pending.pop_back();
-            ++m_budget;
-            if (const auto id = getObjectId(node))
-                enterObject(*id, node);
-            if (node.is_structured()) {
-                for (const json& child : node)
+            const auto id = identityIn(node, s_id);
+            if (id && !m_nodes.try_emplace(*id, &node).second)
+                throwTwice(*id);
+            count += node.size();
+            for (const json& child : node) {
+                if (child.is_structured())
                     pending.push_back(&child);
             }
         }
-        m_budget = m_budget * 2 + 64;
+        m_budget = count * 2 + 64;
     }
 
-    void enterObject(std::size_t id, const json& node)
+    [[noreturn]] static void throwTwice(std::size_t id)
     {
-        const auto entered = m_nodes.try_emplace(id, &node);
-        if (entered.second || node.size() == 1)
-            return;
-        if (entered.first->second->size() > 1)
-            throw std::runtime_error("the identifier " + std::to_string(id) + " stands for two objects");
-        entered.first->second = &node;
+        throw std::runtime_error("the identifier " + std::to_string(id) + " stands for two objects");
     }
 
     const json& under(const char* key)
     {
-        // A document that names parts of itself over and over could be read for ever.
-        if (m_budget-- == 0)
+        // A document that mentions parts of itself over and over could be read for ever.
+        if (m_isEntered && m_budget-- == 0)
             throw std::runtime_error("the document repeats its own parts without end");
         Head& at = m_heads.back();
         if (!at.node->is_object())
@@ -320,13 +346,6 @@ private:
         if (!found->is_array() || at.next >= found->size())
             throw std::runtime_error(std::string("there are too few of \"") + key + "\"");
         return (*found)[at.next++];
-    }
-
-    /// The node that a node's identifier names, or the node itself.
-    const json& meant(const json& node)
-    {
-        const auto id = getObjectId(node);
-        return id ? *Types::strictAt(m_nodes, *id) : node;
     }
 
     template <class Body>
@@ -377,11 +396,19 @@ private:
     {
         within(key.archive, [&] {
             requireObject();
-            const auto id = getObjectId(head());
-            if (id && type.create)
-                m_known.try_emplace(*id, Pointee{object, &type});
+            const Head& at = m_heads.back();
+            if (at.id && !at.mentions && type.create)
+                enter({object, &type});
             Details::visit(*this, type, object);
         });
+    }
+
+    /// The object of the node that is being read.
+    void enter(const Pointee& object)
+    {
+        const Head& at = m_heads.back();
+        if (!m_known.try_emplace(*at.id, Known{object, at.node}).second)
+            throwTwice(*at.id);
     }
 
     void onBase(const Key& key, const Type& type, void* object) override
@@ -394,24 +421,27 @@ private:
 
     void onPointer(const Key& key, const PointerField& field) override
     {
-        within(key.archive, [&] {
-            field.access.set(field, head().is_null() ? Pointee{nullptr, nullptr} : readObject());
-        });
+        if (key.archive)
+            push(under(key.archive));
+        field.access.set(field, head().is_null() ? Pointee{nullptr, nullptr} : readObject());
+        end(key.archive);
     }
 
     Pointee readObject()
     {
         requireObject();
-        const auto id = getObjectId(head());
-        if (id) {
-            const auto known = m_known.find(*id);
-            if (known != m_known.end())
-                return known->second;
+        const Head at = m_heads.back();
+        if (at.id) {
+            const auto known = m_known.find(*at.id);
+            if (known != m_known.end() && (at.mentions || known->second.node == at.node))
+                return known->second.object;
         }
+        if (at.mentions)
+            resolve();
         const Type& type = typeOfHead();
         const Pointee made{Details::ConstructionLog::make(type), &type};
-        if (id)
-            m_known.emplace(*id, made);
+        if (at.id)
+            enter(made);
         Details::visit(*this, type, made.object);
         return made;
     }
@@ -488,9 +518,11 @@ private:
         return owner;
     }
 
+    const json& m_root;
     std::vector<Head> m_heads;
+    bool m_isEntered = false;
     std::unordered_map<std::size_t, const json*> m_nodes;
-    std::unordered_map<std::size_t, Pointee> m_known;
+    std::unordered_map<std::size_t, Known> m_known;
     std::unordered_map<const Types::Image*, std::shared_ptr<const Types::Image>> m_pictures;
     std::size_t m_budget = 0;
 };

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Single values of the Json archives.
 #include <EditorModel/persistence/Json.h>
+#include <EditorModel/persistence/JsonIdentity.h>
 #include <EditorModel/persistence/Utf8.h>
 
 #include <cmath>
@@ -13,21 +14,43 @@ namespace MetaDetails {
 const std::string s_meta = "$meta";
 const std::string s_class_name = "class";
 const std::string s_id = "id";
+const std::string s_reference = "ref";
 } // namespace MetaDetails
 
-std::optional<std::size_t> getObjectId(const nlohmann::json& node)
+namespace {
+
+/// The meta node, or null. It is looked for in every object, and nearly always stands first or not at all.
+const nlohmann::json* metaOf(const nlohmann::json& node)
 {
-    if (!node.is_object())
+    const auto* const members = node.get_ptr<const nlohmann::json::object_t*>();
+    if (!members || members->empty())
+        return nullptr;
+    const int order = members->begin()->first.compare(MetaDetails::s_meta);
+    if (order > 0)
+        return nullptr;
+    const auto found = order == 0 ? members->begin() : members->find(MetaDetails::s_meta);
+    return found == members->end() || !found->second.is_object() ? nullptr : &found->second;
+}
+
+} // namespace
+
+std::optional<std::size_t> identityIn(const nlohmann::json& node, const std::string& key)
+{
+    const auto* const meta = metaOf(node);
+    if (!meta)
         return std::nullopt;
-    const auto meta = node.find(MetaDetails::s_meta);
-    if (meta == node.end() || !meta->is_object())
-        return std::nullopt;
-    const auto id = meta->find(MetaDetails::s_id);
+    const auto id = meta->find(key);
     if (id == meta->end())
         return std::nullopt;
     if (!id->is_number_integer() || *id < 0)
         throw std::runtime_error("the identifier " + id->dump() + " is no whole number");
     return id->get<std::size_t>();
+}
+
+std::optional<std::size_t> getObjectId(const nlohmann::json& node)
+{
+    const auto reference = identityIn(node, MetaDetails::s_reference);
+    return reference ? reference : identityIn(node, MetaDetails::s_id);
 }
 
 namespace detail {

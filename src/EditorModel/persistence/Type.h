@@ -87,7 +87,7 @@ const void* downcast(const void* object)
 template <class Derived, class Base>
 void enterCast()
 {
-    CastEntry(Derived::persistentType(), typeid(Base), &upcast<Derived, Base>, &downcast<Derived, Base>);
+    CastEntry{Derived::persistentType(), typeid(Base), &upcast<Derived, Base>, &downcast<Derived, Base>};
 }
 
 /// Enters a registered class with its persistent bases, the root among them; gives its name, so that a
@@ -95,7 +95,7 @@ void enterCast()
 template <class T, class... Bases>
 const char* enter()
 {
-    TypeEntry(T::persistentType());
+    TypeEntry{T::persistentType()};
     (enterCast<T, Bases>(), ...);
     return T::persistentType().name;
 }
