@@ -273,10 +273,9 @@ const bool compared =
     Ratios::compare("subscribe and unsubscribe : connect and disconnect", "subscribe/0", "connect", 0.3) &&
     Ratios::compare("the same beside 1 000 subscribers of the type", "subscribe/1000", "connect", 0.3) &&
     Ratios::compare("the same beside 100 000 subscribers of the type", "subscribe/100000", "connect", 0.3) &&
-    Ratios::compare("the same beside 1 000 subscribers of the object", "subscribeToOne/1000", "connect",
-                    0.3) &&
-    Ratios::compare("the same beside 100 000 subscribers of the object", "subscribeToOne/100000", "connect",
-                    0.3) &&
+    Ratios::compare("the same beside 1 000 subscribers of the object", "subscribeToOne/1000", "connect") &&
+    Ratios::compare("the same beside 100 000 subscribers of the object", "subscribeToOne/100000",
+                    "connect") &&
     Ratios::compare("three message types : one connection", "subscribeToThreeMessages", "connect") &&
     Ratios::compare("change of a task : assignment and two calls", "changeTask", "assignTask");
 
