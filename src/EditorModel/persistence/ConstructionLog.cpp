@@ -27,12 +27,22 @@ ConstructionLog::~ConstructionLog()
     destroyAll(m_made);
 }
 
-void* ConstructionLog::make(const Type& type)
+/// The place is taken first, so that nothing can fail once the object is there; the constructor may take others.
+template <class Create>
+auto ConstructionLog::noted(void (*destroy)(void* object), Create create) -> decltype(create())
 {
     if (!current)
-        return type.create();
-    current->m_made.push_back({nullptr, type.destroy});
-    return current->m_made.back().object = type.create();
+        return create();
+    const std::size_t place = current->m_made.size();
+    current->m_made.push_back({nullptr, destroy});
+    const auto object = create();
+    current->m_made[place].object = object;
+    return object;
+}
+
+void* ConstructionLog::make(const Type& type)
+{
+    return noted(type.destroy, [&] { return type.create(); });
 }
 
 ISerializable* ConstructionLog::makeNamed(const std::string& name)
@@ -40,12 +50,7 @@ ISerializable* ConstructionLog::makeNamed(const std::string& name)
     const BaseCreator* const creator = findCreator(name);
     if (!creator)
         throwUnregistered();
-    if (!current)
-        return creator->Create();
-    current->m_made.push_back({nullptr, &destroyNamed});
-    ISerializable* const object = creator->Create();
-    current->m_made.back().object = object;
-    return object;
+    return noted(&destroyNamed, [&] { return creator->Create(); });
 }
 
 void ConstructionLog::release(void* object)

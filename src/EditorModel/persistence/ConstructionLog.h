@@ -43,6 +43,9 @@ public:
     std::vector<Made> take();
 
 private:
+    template <class Create>
+    static auto noted(void (*destroy)(void* object), Create create) -> decltype(create());
+
     std::vector<Made> m_made;
     ConstructionLog* m_outer;
 };

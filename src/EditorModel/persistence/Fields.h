@@ -384,6 +384,7 @@ struct MapEntry
 template <class K, class V, class Less>
 struct ItemsOf<std::map<K, V, Less>>
 {
+    static_assert(!isPersistent<K>, "an object that is read and then moved loses its identity");
     using Map = std::map<K, V, Less>;
 
     static void visit(Fields& fields, Map& map)
