@@ -69,12 +69,16 @@ void refuseWhatIsNoFile(const std::filesystem::path& path)
     }
 }
 
+/// Without the protocol a name such as "concat:x" would be taken for an address.
+QByteArray urlOf(const QString& path)
+{
+    return "file:" + QFile::encodeName(path);
+}
+
 AVIOContext* openFile(const QString& path)
 {
-    // Without the protocol a name such as "concat:x" would be taken for an address.
-    const QByteArray url = "file:" + QFile::encodeName(path);
     AVIOContext* file = nullptr;
-    const int error = avio_open(&file, url.constData(), AVIO_FLAG_READ);
+    const int error = avio_open(&file, urlOf(path).constData(), AVIO_FLAG_READ);
     if (error < 0) {
         throwUnreadable(AVUNERROR(error));
     }
@@ -90,24 +94,31 @@ struct Recognition
 
 const char* const unknownFormat = "is in no media format that is known here";
 
-Recognition recognise(AVIOContext& file, const QByteArray& name)
+/// By the content and, if it isn't empty, the name. No format for what FFmpeg doesn't know.
+Recognition guess(AVIOContext& file, const QByteArray& name)
 {
     const AVInputFormat* format = nullptr;
     const int score = av_probe_input_buffer2(&file, &format, name.constData(), nullptr, 0, 0);
     if (score < 0 && score != AVERROR_INVALIDDATA && score != AVERROR_EOF) {
         throwUnreadable(AVUNERROR(score));
     }
+    return {score < 0 ? nullptr : format, score > AVPROBE_SCORE_EXTENSION};
+}
+
+Recognition recognise(AVIOContext& file, const QByteArray& name)
+{
+    const Recognition byName = guess(file, name);
     // Any text is taken for the recording of a terminal if its name ends in .txt.
-    if (score < 0 || format->name == std::string("tty")) {
+    if (!byName.format || byName.format->name == std::string("tty")) {
         throw MediaError(unknownFormat);
     }
-    // A reader that opens files itself takes a name with a '%' for a series of pictures: go by the content
-    // alone.
-    const bool opensFilesItself = (format->flags & AVFMT_NOFILE) != 0;
-    if (opensFilesItself && !name.isEmpty()) {
-        return recognise(file, QByteArray());
+    // The reader of picture series goes by the name first; the readers of single pictures tell what is in the
+    // file.
+    if ((byName.format->flags & AVFMT_NOFILE) != 0) {
+        const Recognition byContent = guess(file, QByteArray());
+        return byContent.format ? byContent : Recognition{byName.format, false};
     }
-    return {format, score > AVPROBE_SCORE_EXTENSION};
+    return byName;
 }
 
 [[noreturn]] void throwDamaged(const Recognition& recognition, int error)
@@ -131,8 +142,8 @@ AVFormatContext* openContext(AVIOContext& file, const Recognition& recognition, 
         throw std::bad_alloc();
     }
     context->pb = &file;
-    const int error = avformat_open_input(&context, QFile::encodeName(path).constData(), recognition.format,
-                                          &options.entries);
+    const int error =
+        avformat_open_input(&context, urlOf(path).constData(), recognition.format, &options.entries);
     if (error < 0) {
         throwDamaged(recognition, error);
     }
@@ -157,7 +168,7 @@ MediaInput::MediaInput(const QString& path)
 {
     refuseWhatIsNoFile(QFile::encodeName(path).toStdString());
     m_file.reset(openFile(path));
-    const Recognition recognition = recognise(*m_file, QFile::encodeName(path));
+    const Recognition recognition = recognise(*m_file, urlOf(path));
     m_context.reset(openContext(*m_file, recognition, path));
     const int error = avformat_find_stream_info(m_context.get(), nullptr);
     if (error < 0) {

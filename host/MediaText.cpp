@@ -92,7 +92,9 @@ std::string formatText(const Media::File& file)
 {
     const QStringList names = QString::fromStdString(file.format).split(',');
     const QString ending = QFileInfo(file.path).suffix().toLower();
-    QString name = names.contains(ending) ? ending : names.first();
+    // The reader of picture series stands for many formats.
+    const bool goesByEnding = names.contains(ending) || names.first() == "image2";
+    QString name = goesByEnding ? ending : names.first();
     // The readers of single pictures: "png_pipe".
     name.remove(QRegularExpression("_pipe$"));
     return printable(name);

@@ -130,6 +130,19 @@ TEST(ProbeCommand, WritesNamesAsUtf8InEveryLocale)
     }
 }
 
+TEST(ProbeCommand, TakesNoNameForAnAddress)
+{
+    const Folder folder;
+    for (const char* name : {"concat:a.wav", "http:b.wav", "file:c.wav", "pipe:0"}) {
+        folder.copy("speech.wav", name);
+        EXPECT_THAT(editormodel({"probe", name}, folder.path()).output,
+                    hasLine({name, "wav", "00:00:01.500"}));
+    }
+    folder.copy("picture.tga", "http:d.tga");
+    EXPECT_THAT(editormodel({"probe", "http:d.tga"}, folder.path()).output,
+                hasLine({"#0", "picture", "targa"}));
+}
+
 TEST(ProbeCommand, LetsNoNameSteerTheTerminal)
 {
     const Outcome outcome = editormodel({"probe", "a\nb\x1b[2J"});

@@ -198,6 +198,8 @@ TEST_F(MediaProbe, DescribesPicturesWithoutLengthAndRate)
     } pictures[] = {{sample("picture.png"), "png", 64, 48, true},
                     {sample("glass.png"), "png", 64, 48, false},
                     {sample("picture.jpg"), "mjpeg", 80, 60, true},
+                    // Has nothing at its start that tells the format; known by its name.
+                    {sample("picture.tga"), "targa", 64, 48, true},
                     // Found by their content alone, and no series of pictures.
                     {folder.copy("picture.png", "wrong-ending.mp4"), "png", 64, 48, true},
                     {folder.copy("picture.jpg", "100%03d.jpg"), "mjpeg", 80, 60, true}};
@@ -216,6 +218,22 @@ TEST_F(MediaProbe, DescribesPicturesWithoutLengthAndRate)
         EXPECT_EQ(track.frameRateN, 0);
         EXPECT_EQ(track.frameRateD, 1);
     }
+}
+
+TEST_F(MediaProbe, TellsTheFormatOfAPictureByItsContent)
+{
+    EXPECT_EQ(describe(sample("picture.jpg")).format, "jpeg_pipe");
+    EXPECT_EQ(describe(folder.copy("picture.png", "picture.jpg")).format, "png_pipe");
+}
+
+TEST_F(MediaProbe, TakesAFileNamedLikeASeriesForItself)
+{
+    folder.copy("picture.tga", "1.tga");
+    const auto picture = describe(folder.copy("picture.jpg", "%d.tga")).videoTracks.at(0);
+    EXPECT_EQ(picture.width, 80);
+    EXPECT_EQ(picture.height, 60);
+    EXPECT_EQ(reason(folder.write("%d.tga", "no picture")),
+              "is damaged or incomplete: a picture without a size");
 }
 
 TEST_F(MediaProbe, TakesAMovingPictureForVideo)

@@ -112,6 +112,8 @@ TEST(MediaText, CallsAFormatByTheNameThatTheFileGoesBy)
     EXPECT_EQ(Host::formatText(file), "mov");
     file.setFormat("png_pipe");
     EXPECT_EQ(Host::formatText(file), "png");
+    file.setFormat("image2")->setPath("c.TGA");
+    EXPECT_EQ(Host::formatText(file), "tga");
     file.setFormat("");
     EXPECT_EQ(Host::formatText(file), "");
 }
