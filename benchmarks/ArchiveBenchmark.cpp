@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Ten thousand records with pointers, saved and loaded: through the library's field lists, beside the same
 // records with Boost.Serialization's templates, and with a tree of nlohmann json, used by hand.
-#include "benchmarks/Ratio.h"
+#include "Ratio.h"
 
 #include <EditorModel/bus/PubSub.h>
 #include <EditorModel/persistence/Document.h>
@@ -21,6 +21,8 @@
 #include <benchmark/benchmark.h>
 
 #include <QBuffer>
+
+#include <malloc.h>
 
 #include <sstream>
 #include <stdexcept>
@@ -440,4 +442,23 @@ DOCUMENT_BENCHMARKS(Xml, Stream);
 DOCUMENT_BENCHMARKS(Json, Archive);
 DOCUMENT_BENCHMARKS(Json, Stream);
 
+using Ratios::compare;
+
+const bool compared =
+    compare("binary archive, save : Boost by hand", "BinarySave", "BinarySaveByHand", 1.15) &&
+    compare("binary archive, load : Boost by hand", "BinaryLoad", "BinaryLoadByHand", 1.15) &&
+    compare("XML archive, save : Boost by hand", "XmlSave", "XmlSaveByHand", 1.15) &&
+    compare("XML archive, load : Boost by hand", "XmlLoad", "XmlLoadByHand", 1.15) &&
+    compare("Json archive, save : a tree by hand and its dump", "JsonSave", "JsonSaveByHand", 1.3) &&
+    compare("Json archive, load : a parse and reading by hand", "JsonLoad", "JsonLoadByHand", 1.3);
+
 } // namespace
+
+int main(int argc, char** argv)
+{
+    // Memory that goes back to the system between two rounds would be measured with whichever asks for it
+    // next.
+    mallopt(M_TRIM_THRESHOLD, 1 << 30);
+    mallopt(M_MMAP_THRESHOLD, 1 << 30);
+    return Ratios::run(argc, argv);
+}

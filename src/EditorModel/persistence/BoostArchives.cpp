@@ -478,6 +478,9 @@ using PictureOwners = std::map<const Types::Image*, std::shared_ptr<const Types:
 /// The address of this names the owners among an archive's helpers.
 constexpr char pictureOwnersId = 0;
 
+/// The longest text whose buffer is kept for the next one, in bytes.
+constexpr std::size_t keptBuffer = 4096;
+
 template <class Archive>
 class ArchiveReader final : public ArchiveFields<Archive>
 {
@@ -514,11 +517,15 @@ private:
         }
     }
 
+    /// Texts pass through one buffer: most are short, and an allocation for each would cost more than the
+    /// text.
     void load(const Key& key, QString& text)
     {
-        std::string utf8;
+        thread_local std::string utf8;
         transfer(key.archive, utf8);
         text = textOfUtf8(utf8);
+        if (utf8.size() > keptBuffer)
+            std::string().swap(utf8);
     }
 
     void load(const Key& key, MTime& time)
@@ -556,7 +563,9 @@ private:
                 field.access.set(field, {nullptr, nullptr});
                 return;
             }
-            const Type* const type = findType(typeidOf(found->get_eti()), field.declared);
+            // Most pointers lead to an object of the very class that their field is declared with.
+            const Type* const type =
+                found == declared ? field.declared : findType(typeidOf(found->get_eti()), nullptr);
             if (!type)
                 throwUnregistered();
             field.access.set(field, {object, type});
@@ -620,7 +629,7 @@ void writeRoots(std::ostream& stream, Roots& roots)
 {
     Archive archive(stream);
     ArchiveWriter<Archive> fields(archive);
-    fields(rootsKey, roots);
+    visitRoots(fields, roots);
 }
 
 template <class Archive>
@@ -628,7 +637,7 @@ void readRoots(std::istream& stream, Roots& roots)
 {
     Archive archive(stream);
     ArchiveReader<Archive> fields(archive);
-    fields(rootsKey, roots);
+    visitRoots(fields, roots);
 }
 
 } // namespace

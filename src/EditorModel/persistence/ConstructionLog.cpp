@@ -27,7 +27,8 @@ ConstructionLog::~ConstructionLog()
     destroyAll(m_made);
 }
 
-/// The place is taken first, so that nothing can fail once the object is there; the constructor may take others.
+/// The place is taken first, so that nothing can fail once the object is there; the constructor may take
+/// others.
 template <class Create>
 auto ConstructionLog::noted(void (*destroy)(void* object), Create create) -> decltype(create())
 {

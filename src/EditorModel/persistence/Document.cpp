@@ -136,7 +136,8 @@ QByteArray jsonArchived(const Roots& roots)
     nlohmann::json root;
     {
         Serialize::Json::oarchive archive(root);
-        archive << boost::serialization::make_nvp(Serialize::Details::rootsKey, roots);
+        Serialize::Details::atRoots(
+            [&] { archive << boost::serialization::make_nvp(Serialize::Details::rootsKey, roots); });
     }
     root[routeKey] = archiveRoute;
     root[versionKey] = jsonVersion;
@@ -234,7 +235,8 @@ Graph fromJson(const QByteArray& document)
                                      ", which is not known");
         return graphOf([&](Roots& roots) {
             Serialize::Json::iarchive archive(root);
-            archive >> boost::serialization::make_nvp(Serialize::Details::rootsKey, roots);
+            Serialize::Details::atRoots(
+                [&] { archive >> boost::serialization::make_nvp(Serialize::Details::rootsKey, roots); });
         });
     });
 }

@@ -3,6 +3,7 @@
 
 #include <EditorModel/persistence/BoostArchives.h>
 #include <EditorModel/persistence/FailurePlace.h>
+#include <EditorModel/persistence/Roots.h>
 
 #include <cstring>
 #include <stdexcept>
@@ -18,30 +19,18 @@ thread_local int depth = 0;
 
 struct DepthGuard
 {
-    DepthGuard()
+    explicit DepthGuard(int& aDepth) : level(aDepth)
     {
-        if (++depth > maxDepth) {
-            --depth;
+        if (level == 0)
+            FailurePlace::clear();
+        if (level == maxDepth)
             throw std::runtime_error("objects nest deeper than " + std::to_string(maxDepth) + " levels");
-        }
+        ++level;
     }
-    ~DepthGuard() { --depth; }
-};
+    ~DepthGuard() { --level; }
 
-/// Runs `body`; an exception on its way out is noted with the key, or with the number of the item.
-template <class Body>
-void placed(const Key& key, int item, Body body)
-{
-    try {
-        body();
-    } catch (...) {
-        if (!key.archive)
-            throw;
-        const bool isItem = std::strcmp(key.stream, itemKey.stream) == 0;
-        FailurePlace::add(key.archive, isItem ? item : 0);
-        throw;
-    }
-}
+    int& level;
+};
 
 /// Entered classes, by what they are looked up by. Never destroyed, as static destructors may still save.
 struct Classes
@@ -91,10 +80,21 @@ Pointee pointee(const void* object, const std::type_info& info, const Type* gues
 
 void visit(Fields& fields, const Type& type, void* object)
 {
-    if (depth == 0)
-        FailurePlace::clear();
-    const DepthGuard guard;
-    type.visit(fields, object);
+    const DepthGuard guard(depth);
+    const Fields::Position outer = fields.m_position;
+    try {
+        type.visit(fields, object);
+    } catch (...) {
+        fields.m_position.note();
+        fields.m_position = outer;
+        throw;
+    }
+    fields.m_position = outer;
+}
+
+void visitRoots(Fields& fields, Roots& roots)
+{
+    atRoots([&] { fields(rootsKey, roots); });
 }
 
 void throwRepeatedKey()
@@ -152,31 +152,18 @@ const Type* findType(const std::string& name)
 
 Fields::~Fields() = default;
 
-void Fields::scalar(const Key& key, const Scalar& value, const void* address)
+void Fields::Position::note() const
 {
-    Details::placed(key, m_item, [&] { onScalar(key, value, address); });
-}
-
-void Fields::object(const Key& key, const Type& type, void* object)
-{
-    Details::placed(key, m_item, [&] { onObject(key, type, object); });
+    if (!key.archive)
+        return;
+    const bool isItem = std::strcmp(key.stream, Details::itemKey.stream) == 0;
+    Details::FailurePlace::add(key.archive, isItem ? item : 0);
 }
 
 void Fields::baseFields(const char* key, const Type& type, void* object)
 {
-    Details::placed(key, m_item, [&] { onBase(Key(key, "BaseOfObject"), type, object); });
-}
-
-void Fields::pointer(const Key& key, const PointerField& field)
-{
-    Details::placed(key, m_item, [&] { onPointer(key, field); });
-}
-
-void Fields::container(const Key& key, const Type& type, void* container)
-{
-    const int item = std::exchange(m_item, 0);
-    Details::placed(key, item, [&] { onContainer(key, type, container); });
-    m_item = item;
+    m_position.key = Key(key, "BaseOfObject");
+    onBase(m_position.key, type, object);
 }
 
 int Fields::beginSequence(SequenceKind kind, int count)
@@ -186,7 +173,7 @@ int Fields::beginSequence(SequenceKind kind, int count)
 
 void Fields::beginItem(int index)
 {
-    m_item = index;
+    m_position.item = index;
     onBeginItem(index);
 }
 
@@ -202,7 +189,8 @@ void Fields::endSequence(int count)
 
 void Fields::entry(const Type& pair, void* entry)
 {
-    Details::placed(Details::itemKey, m_item, [&] { onEntry(pair, entry); });
+    m_position.key = Details::itemKey;
+    onEntry(pair, entry);
 }
 
 void Fields::binary(QByteArray& bytes, int size)

@@ -82,6 +82,14 @@ enum SequenceKind : int
     Group,        ///< a pair or a tuple: nothing
 };
 
+class Fields;
+
+namespace Details {
+/// Runs a field list, guards the depth to which lists may nest, and notes the field that an exception comes
+/// from.
+EDITORMODEL_EXPORT void visit(Fields& fields, const Type& type, void* object);
+} // namespace Details
+
 /// The visitor of field lists. A class tells its fields once, in archive order; what a visitor does with
 /// them, write, read or check, is its own affair. Any exception that leaves a field is noted with the field's
 /// key.
@@ -108,10 +116,27 @@ public:
     template <class T, class Encode, class Decode>
     Fields& coded(const Key& key, T& value, Encode encode, Decode decode);
 
-    void scalar(const Key& key, const Scalar& value, const void* address);
-    void object(const Key& key, const Type& type, void* object);
-    void pointer(const Key& key, const PointerField& field);
-    void container(const Key& key, const Type& type, void* container);
+    /// The value's own address, or null for a copy that stands in for it.
+    void scalar(const Key& key, const Scalar& value, const void* address)
+    {
+        m_position.key = key;
+        onScalar(key, value, address);
+    }
+    void object(const Key& key, const Type& type, void* object)
+    {
+        m_position.key = key;
+        onObject(key, type, object);
+    }
+    void pointer(const Key& key, const PointerField& field)
+    {
+        m_position.key = key;
+        onPointer(key, field);
+    }
+    void container(const Key& key, const Type& type, void* container)
+    {
+        m_position.key = key;
+        onContainer(key, type, container);
+    }
 
     /// The items of a container stand between `beginSequence` and `endSequence`. `count` is what is written;
     /// the result is the number of items to visit.
@@ -149,17 +174,25 @@ private:
 
     void baseFields(const char* key, const Type& type, void* object);
 
+    friend void Details::visit(Fields& fields, const Type& type, void* object);
+
+    /// The field that is being visited, for the place of a failure.
+    struct Position
+    {
+        Key key{nullptr};
+        int item = 0;
+
+        void note() const;
+    };
+
     const bool m_loading;
-    int m_item = 0;
+    Position m_position;
 };
 
 namespace Details {
 
 /// What the complete object at `object` is; `guess` is the type that it most likely has.
 EDITORMODEL_EXPORT Pointee pointee(const void* object, const std::type_info& info, const Type* guess);
-
-/// Runs a field list, guarding the depth to which lists may nest.
-EDITORMODEL_EXPORT void visit(Fields& fields, const Type& type, void* object);
 
 [[noreturn]] EDITORMODEL_EXPORT void throwRepeatedKey();
 

@@ -1,10 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include <EditorModel/persistence/FailurePlace.h>
 #include <EditorModel/persistence/Serializable.h>
 
 #include <deque>
 #include <iosfwd>
+
+namespace Serialize {
+class Fields;
+}
 
 namespace Serialize::Details {
 
@@ -13,6 +18,20 @@ namespace Serialize::Details {
 using Roots = std::deque<const ISerializable*>;
 
 constexpr const char* rootsKey = "objects";
+
+/// Runs what stores or reads the roots; their key is noted as that of any other field.
+template <class Body>
+void atRoots(Body body)
+{
+    try {
+        body();
+    } catch (...) {
+        FailurePlace::add(rootsKey, 0);
+        throw;
+    }
+}
+
+void visitRoots(Fields& fields, Roots& roots);
 
 void writeBinaryArchive(std::ostream& stream, Roots& roots);
 void writeXmlArchive(std::ostream& stream, Roots& roots);

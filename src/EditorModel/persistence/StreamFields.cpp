@@ -143,13 +143,13 @@ void readFields(IDeserializer& deserializer, const Type& type, void* object)
 void writeStream(ISerializer& serializer, Roots& roots)
 {
     FieldWriter fields(serializer);
-    fields(rootsKey, roots);
+    visitRoots(fields, roots);
 }
 
 void readStream(IDeserializer& deserializer, Roots& roots)
 {
     FieldReader fields(deserializer);
-    fields(rootsKey, roots);
+    visitRoots(fields, roots);
 }
 
 } // namespace Details
