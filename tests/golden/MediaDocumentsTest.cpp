@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-// What documents of media files look like, written down by hand. Stored data is for life: these texts are never
-// written anew from what the code gives.
+// What documents of media files look like, written down by hand. Stored data is for life: these texts are
+// never written anew from what the code gives.
 #include <EditorModel/media/Media.h>
 #include <EditorModel/persistence/Document.h>
 #include <EditorModel/persistence/Json.h>
