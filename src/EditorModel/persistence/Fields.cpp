@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/persistence/Fields.h>
 
-#include <EditorModel/persistence/BoostArchives.h>
+#include <EditorModel/persistence/archives/Registration.h>
 #include <EditorModel/persistence/FailurePlace.h>
 #include <EditorModel/persistence/Roots.h>
 

@@ -2,7 +2,7 @@
 #include <EditorModel/persistence/streams/GraphReader.h>
 
 #include <EditorModel/persistence/ConstructionLog.h>
-#include <EditorModel/persistence/Pictures.h>
+#include <EditorModel/persistence/archives/Pictures.h>
 #include <EditorModel/persistence/Serializable.h>
 #include <EditorModel/persistence/Utf8.h>
 #include <EditorModel/types/Image.h>

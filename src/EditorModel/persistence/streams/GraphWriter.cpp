@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/persistence/streams/GraphWriter.h>
 
-#include <EditorModel/persistence/Pictures.h>
+#include <EditorModel/persistence/archives/Pictures.h>
 #include <EditorModel/persistence/Serializable.h>
 #include <EditorModel/persistence/Type.h>
 #include <EditorModel/persistence/Unregistered.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include <EditorModel/persistence/Pictures.h>
+#include <EditorModel/persistence/archives/Pictures.h>
 
 #include <EditorModel/persistence/Fields.h>
 #include <EditorModel/types/Image.h>

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Single values of the Json archives.
-#include <EditorModel/persistence/Json.h>
-#include <EditorModel/persistence/JsonIdentity.h>
 #include <EditorModel/persistence/Utf8.h>
+#include <EditorModel/persistence/archives/JsonNodes.h>
 
 #include <cmath>
+#include <cstring>
 #include <limits>
 #include <stdexcept>
 
@@ -33,6 +33,11 @@ const nlohmann::json* metaOf(const nlohmann::json& node)
 }
 
 } // namespace
+
+bool sharesKey(const nlohmann::json& node, const char* key)
+{
+    return std::strcmp(key, "element") == 0 || (std::strcmp(key, "item") == 0 && node.contains(countKey));
+}
 
 std::optional<std::size_t> identityIn(const nlohmann::json& node, const std::string& key)
 {
