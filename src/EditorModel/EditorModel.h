@@ -19,7 +19,6 @@
 #include <EditorModel/media/Video.h>
 #include <EditorModel/media/Views.h>
 #include <EditorModel/persistence/Document.h>
-#include <EditorModel/persistence/FieldArchive.h>
 #include <EditorModel/persistence/Fields.h>
 #include <EditorModel/persistence/Persistent.h>
 #include <EditorModel/persistence/Serializable.h>

@@ -6,6 +6,7 @@
 #include <exception>
 #include <map>
 #include <set>
+#include <type_traits>
 #include <utility>
 
 namespace Message {
@@ -179,7 +180,7 @@ class View<T>::SetterChain
 {
 public:
     /// The operation goes over to the new chain; the other one does nothing at its end.
-    SetterChain(SetterChain&& other);
+    SetterChain(SetterChain&& other) noexcept(std::is_nothrow_move_constructible_v<T>);
     SetterChain& operator=(SetterChain&&) = delete;
     ~SetterChain() noexcept(false);
 

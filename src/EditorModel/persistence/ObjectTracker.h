@@ -2,7 +2,7 @@
 #pragma once
 
 #include <EditorModel/Export.h>
-#include <EditorModel/persistence/FieldArchive.h>
+#include <EditorModel/persistence/detail/FieldArchive.h>
 
 #include <functional>
 #include <map>

@@ -460,7 +460,7 @@ View<T>::SetterChain::SetterChain(View* view, const T* object)
 {}
 
 template <typename T>
-View<T>::SetterChain::SetterChain(SetterChain&& other)
+View<T>::SetterChain::SetterChain(SetterChain&& other) noexcept(std::is_nothrow_move_constructible_v<T>)
     : m_view(other.m_view),
       m_active(std::exchange(other.m_active, false)),
       m_own(other.m_own),
