@@ -5,7 +5,12 @@
 #include <EditorModel/persistence/ConstructionLog.h>
 #include <EditorModel/persistence/Json.h>
 
+#include <boost/serialization/vector.hpp>
+
 #include <gtest/gtest.h>
+
+#include <limits>
+#include <vector>
 
 namespace {
 
@@ -13,6 +18,20 @@ using boost::serialization::make_nvp;
 using nlohmann::json;
 using Serialize::Json::iarchive;
 using Serialize::Json::oarchive;
+
+/// With a body of its own.
+struct Client
+{
+    short small = 0;
+    unsigned long long large = 0;
+
+    template <class Archive>
+    void serialize(Archive& ar, const unsigned int)
+    {
+        ar& make_nvp("small", small);
+        ar& make_nvp("large", large);
+    }
+};
 
 template <class T>
 json saved(const T& value)
@@ -164,18 +183,93 @@ TEST(JsonArchive, AnIdentifierThatIsNotInTheTableThrows)
     EXPECT_THROW(load(root, leaf), std::out_of_range);
 }
 
-TEST(JsonArchive, AnObjectHeldByValueTwiceIsCopiedFromItsMention)
+TEST(JsonArchive, AnObjectHeldByValueTwiceStandsTwice)
 {
     const Sample::Leaf leaf(4, QStringLiteral("four"));
+    const Sample::Leaf* const pointer = &leaf;
     json root;
-    oarchive(root) << make_nvp("first", leaf) << make_nvp("second", leaf);
-    EXPECT_EQ(root["second"], json::parse(R"({"$meta": {"ref": 1}})"));
+    oarchive(root) << make_nvp("first", leaf) << make_nvp("second", leaf) << make_nvp("pointer", pointer);
+    EXPECT_EQ(root["first"], json::parse(R"({"$meta": {"id": 1}, "number": 4, "text": "four"})"));
+    EXPECT_EQ(root["second"], json::parse(R"({"number": 4, "text": "four"})"));
+    EXPECT_EQ(root["pointer"], json::parse(R"({"$meta": {"class": "Sample::Leaf", "ref": 1}})"));
+}
+
+TEST(JsonArchive, AKeyThatStandsTwiceIsRefusedAndEndsTheArchive)
+{
+    const Sample::Leaf first;
+    const Sample::Leaf second;
+    const Sample::Leaf* const pointer = &first;
+    json root;
+    oarchive archive(root);
+    archive << make_nvp("content", first);
+    EXPECT_THROW(archive << make_nvp("content", second), std::runtime_error);
+    EXPECT_THROW(archive << make_nvp("pointer", pointer), std::logic_error);
+}
+
+TEST(JsonArchive, AReaderGoesOnAfterAnException)
+{
+    const json root = json::parse(R"({"a": {"number": "x", "text": ""}, "b": {"number": 3, "text": ""}})");
+    Sample::Leaf leaf;
+    iarchive archive(root);
+    EXPECT_THROW(archive >> make_nvp("a", leaf), std::runtime_error);
+    archive >> make_nvp("b", leaf);
+    EXPECT_EQ(leaf.number, 3);
+}
+
+TEST(JsonArchive, AMentionHeldByValueIsACopyOfWhatItNames)
+{
+    const json root = json::parse(R"({"first": {"$meta": {"id": 1}, "number": 4, "text": "four"},
+                                      "second": {"$meta": {"ref": 1}}})");
     Sample::Leaf first;
     Sample::Leaf second;
     iarchive archive(root);
     archive >> make_nvp("first", first) >> make_nvp("second", second);
     EXPECT_EQ(first.number, 4);
     EXPECT_EQ(second.number, 4);
+}
+
+TEST(JsonArchive, AnIdentifierOfAnyShapeIsNamedWithoutBeingWrittenOut)
+{
+    for (const char* const key : {"id", "ref"}) {
+        json deep = 1;
+        for (int level = 0; level < 300000; ++level)
+            deep = json::array({std::move(deep)});
+        json root;
+        root["content"]["$meta"][key] = std::move(deep);
+        Sample::Leaf leaf;
+        EXPECT_EQ(errorOf(root, leaf), "an identifier is array, not a whole number from 0 on");
+    }
+}
+
+/// A thousand mentions of one long text, held by value.
+TEST(JsonArchive, ALongTextIsNotMultipliedByMentions)
+{
+    json root;
+    root["text"] = json::parse(R"({"$meta": {"id": 1}, "number": 1})");
+    root["text"]["text"] = std::string(100000, 'x');
+    json items = json::array();
+    for (int i = 0; i < 1000; ++i)
+        items.push_back(json::parse(R"({"$meta": {"ref": 1}})"));
+    root["content"] = {{"count", 1000}, {"item_version", 0}, {"item", items}};
+    std::deque<Sample::Leaf> leaves;
+    EXPECT_EQ(errorOf(root, leaves), "the document repeats its own parts without end");
+    EXPECT_LT(leaves.size(), 10u);
+}
+
+TEST(JsonArchive, CountsAndNumbersOfBodiesAreChecked)
+{
+    std::vector<Client> clients;
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": 500000000, "item_version": 0, "item": [1]}})"), clients),
+              "there are 1 items where 500000000 are counted");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": -1, "item_version": 0}})"), clients),
+              "a count of -1 items");
+    Client client;
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"small": 70000, "large": 1}})"), client),
+              "the number 70000 is out of range");
+    EXPECT_EQ(errorOf(json::parse(R"({"content": {"small": 1, "large": -1}})"), client),
+              "the number -1 is out of range");
+    client.large = std::numeric_limits<unsigned long long>::max();
+    EXPECT_THROW(saved(client), std::runtime_error);
 }
 
 TEST(JsonArchive, AMentionMayStandBeforeWhatItNames)
@@ -226,13 +320,13 @@ TEST(JsonArchive, DamageIsNamed)
     EXPECT_EQ(errorOf(json::parse(R"({"content": {"$meta": {"class": "QPixmap"}}})"), pointer),
               "unregistered class - derived class not registered or exported");
     EXPECT_EQ(errorOf(json::parse(R"({"content": {"$meta": {"class": "Sample::Leaf", "id": -1}}})"), pointer),
-              "the identifier -1 is no whole number");
+              "an identifier is number, not a whole number from 0 on");
 
     std::deque<int> numbers;
     EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": 3, "item_version": 0, "item": [1]}})"), numbers),
               "there are 1 items where 3 are counted");
     EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": -1, "item_version": 0}})"), numbers),
-              "there are 0 items where -1 are counted");
+              "a count of -1 items");
 
     std::map<int, double> map;
     EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": 2, "item_version": 0, "item": [

@@ -76,6 +76,8 @@ private:
     Fields& fields();
     void begin(const char* key);
     void end(const char* key);
+    void abandon(const char* key);
+    void checkCount(std::size_t) const {}
     void number(qint64& value);
     void number(double& value);
 
@@ -115,6 +117,8 @@ private:
     Fields& fields();
     void begin(const char* key);
     void end(const char* key);
+    void abandon(const char* key);
+    void checkCount(std::size_t count) const;
     void number(qint64& value);
     void number(double& value);
 

@@ -62,6 +62,8 @@ private:
     Serialize::Fields& fields();
     void begin(const char*) {}
     void end(const char*) {}
+    void abandon(const char*) {}
+    void checkCount(std::size_t) const {}
     void number(qint64&) {}
     void number(double&) {}
 

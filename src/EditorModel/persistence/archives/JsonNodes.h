@@ -18,6 +18,12 @@ constexpr const char* bytesKey = "bytes";
 /// "item" is a key like any other.
 bool sharesKey(const nlohmann::json& node, const char* key);
 
+/// Throws unless a collection's node holds as many items as are counted.
+void requireItems(const nlohmann::json& collection, std::size_t count);
+
+/// Throws for more bytes than a QByteArray takes.
+void requireByteCount(std::size_t count);
+
 /// The number under one key of a node's meta node, if it is there.
 std::optional<std::size_t> identityIn(const nlohmann::json& node, const std::string& key);
 

@@ -60,6 +60,22 @@ private:
         const json* node;
     };
 
+    /// Leaves whatever is begun in it, also when an exception passes through.
+    class HeadScope
+    {
+    public:
+        explicit HeadScope(Reader& reader)
+            : m_reader(reader), m_depth(static_cast<std::ptrdiff_t>(reader.m_heads.size()))
+        {}
+        ~HeadScope() { m_reader.m_heads.erase(m_reader.m_heads.begin() + m_depth, m_reader.m_heads.end()); }
+        HeadScope(const HeadScope&) = delete;
+        HeadScope& operator=(const HeadScope&) = delete;
+
+    private:
+        Reader& m_reader;
+        const std::ptrdiff_t m_depth;
+    };
+
     void push(const json& node)
     {
         const auto reference = identityIn(node, s_reference);
@@ -80,7 +96,7 @@ private:
     void enterObjects()
     {
         m_isEntered = true;
-        std::size_t count = 0;
+        std::size_t weight = 0;
         std::vector<const json*> pending{&m_root};
         while (!pending.empty()) {
             const json& node = *pending.back();
@@ -88,13 +104,33 @@ private:
             const auto id = identityIn(node, s_id);
             if (id && !m_nodes.try_emplace(*id, &node).second)
                 throwTwice(*id);
-            count += node.size();
             for (const json& child : node) {
+                weight += weightOf(child);
                 if (child.is_structured())
                     pending.push_back(&child);
             }
         }
-        m_budget = count * 2 + 64;
+        m_budget = weight * 4 + 64;
+    }
+
+    /// What reading a node takes, without what is under it.
+    static std::size_t weightOf(const json& node)
+    {
+        const auto* const text = node.get_ptr<const std::string*>();
+        return 1 + (text ? text->size() : 0);
+    }
+
+    /// A document that mentions parts of itself over and over could be read for ever, and into any amount of
+    /// memory. One that was saved reads each part once.
+    const json& spend(const json& node)
+    {
+        if (!m_isEntered)
+            return node;
+        const std::size_t weight = weightOf(node);
+        if (weight > m_budget)
+            throw std::runtime_error("the document repeats its own parts without end");
+        m_budget -= weight;
+        return node;
     }
 
     [[noreturn]] static void throwTwice(std::size_t id)
@@ -104,9 +140,6 @@ private:
 
     const json& under(const char* key)
     {
-        // A document that mentions parts of itself over and over could be read for ever.
-        if (m_isEntered && m_budget-- == 0)
-            throw std::runtime_error("the document repeats its own parts without end");
         Head& at = m_heads.back();
         if (!at.node->is_object())
             throw std::runtime_error(std::string("there is ") + at.node->type_name() + " where \"" + key +
@@ -115,18 +148,18 @@ private:
         if (found == at.node->end())
             throw std::runtime_error(std::string("\"") + key + "\" is missing");
         if (!sharesKey(*at.node, key))
-            return *found;
+            return spend(*found);
         if (!found->is_array() || at.next >= found->size())
             throw std::runtime_error(std::string("there are too few of \"") + key + "\"");
-        return (*found)[at.next++];
+        return spend((*found)[at.next++]);
     }
 
     template <class Body>
     void within(const char* key, Body body)
     {
+        const HeadScope scope(*this);
         begin(key);
         body();
-        end(key);
     }
 
     void onScalar(const Key& key, const Scalar& value, const void*) override
@@ -194,10 +227,10 @@ private:
 
     void onPointer(const Key& key, const PointerField& field) override
     {
+        const HeadScope scope(*this);
         if (key.archive)
             push(under(key.archive));
         field.access.set(field, head().is_null() ? Pointee{nullptr, nullptr} : readObject());
-        end(key.archive);
     }
 
     Pointee readObject()
@@ -252,11 +285,9 @@ private:
         if (kind == Group)
             return count;
         within(countKey, [&] { load(count); });
-        const auto items = head().find(Details::itemKey.archive);
-        const std::size_t stored = items == head().end() || !items->is_array() ? 0 : items->size();
-        if (count < 0 || static_cast<std::size_t>(count) != stored)
-            throw std::runtime_error("there are " + std::to_string(stored) + " items where " +
-                                     std::to_string(count) + " are counted");
+        if (count < 0)
+            throw std::runtime_error("a count of " + std::to_string(count) + " items");
+        requireItems(head(), static_cast<std::size_t>(count));
         return count;
     }
 
@@ -311,6 +342,7 @@ const json& iarchive::headRef() const
 
 void iarchive::load_binary(void* address, std::size_t count)
 {
+    requireByteCount(count);
     QByteArray bytes;
     m_reader->binary(bytes, static_cast<int>(count));
     std::memcpy(address, bytes.constData(), count);
@@ -329,6 +361,16 @@ void iarchive::begin(const char* key)
 void iarchive::end(const char* key)
 {
     m_reader->end(key);
+}
+
+void iarchive::abandon(const char* key)
+{
+    m_reader->end(key);
+}
+
+void iarchive::checkCount(std::size_t count) const
+{
+    requireItems(headRef(), count);
 }
 
 void iarchive::number(qint64& value)

@@ -39,6 +39,21 @@ bool sharesKey(const nlohmann::json& node, const char* key)
     return std::strcmp(key, "element") == 0 || (std::strcmp(key, "item") == 0 && node.contains(countKey));
 }
 
+void requireItems(const nlohmann::json& collection, std::size_t count)
+{
+    const auto items = collection.find(Details::itemKey.archive);
+    const std::size_t stored = items == collection.end() || !items->is_array() ? 0 : items->size();
+    if (count != stored)
+        throw std::runtime_error("there are " + std::to_string(stored) + " items where " + std::to_string(count) +
+                                 " are counted");
+}
+
+void requireByteCount(std::size_t count)
+{
+    if (count > static_cast<std::size_t>(std::numeric_limits<int>::max()))
+        throw std::length_error(std::to_string(count) + " bytes are too many for one value");
+}
+
 std::optional<std::size_t> identityIn(const nlohmann::json& node, const std::string& key)
 {
     const auto* const meta = metaOf(node);
@@ -48,7 +63,8 @@ std::optional<std::size_t> identityIn(const nlohmann::json& node, const std::str
     if (id == meta->end())
         return std::nullopt;
     if (!id->is_number_integer() || *id < 0)
-        throw std::runtime_error("the identifier " + id->dump() + " is no whole number");
+        throw std::runtime_error(std::string("an identifier is ") + id->type_name() +
+                                 ", not a whole number from 0 on");
     return id->get<std::size_t>();
 }
 

@@ -4,6 +4,8 @@
 #include <EditorModel/persistence/archives/Pictures.h>
 
 #include <deque>
+#include <stdexcept>
+#include <limits>
 #include <unordered_map>
 
 namespace Serialize::Json {
@@ -44,6 +46,8 @@ public:
 
     void begin(const char* key)
     {
+        if (m_hasFailed)
+            throw std::logic_error("the archive has failed before");
         if (key)
             m_nodes.emplace_back();
     }
@@ -57,9 +61,12 @@ public:
         json& parent = head();
         if (sharesKey(parent, key))
             parent[key].push_back(std::move(node));
-        else
-            parent[key] = std::move(node);
+        else if (!parent.emplace(key, std::move(node)).second)
+            fail(std::string("the key \"") + key + "\" stands twice");
     }
+
+    /// After an exception some of the tree is gone, with the places of objects in it.
+    void abandon() { m_hasFailed = true; }
 
 private:
     /// Where an object stands in the tree, by its members: nodes move, these do not.
@@ -69,11 +76,22 @@ private:
         std::size_t id;
     };
 
+    [[noreturn]] void fail(const std::string& reason)
+    {
+        abandon();
+        throw std::runtime_error(reason);
+    }
+
     template <class Body>
     void within(const char* key, Body body)
     {
         begin(key);
-        body();
+        try {
+            body();
+        } catch (...) {
+            abandon();
+            throw;
+        }
         end(key);
     }
 
@@ -105,15 +123,10 @@ private:
     {
         within(key.archive, [&] {
             head() = json::object();
-            if (!type.create) {
-                Details::visit(*this, type, object);
-                return;
-            }
-            const auto entered = m_places.try_emplace(Identity{object, &type}, Place{membersOfHead(), 0});
-            if (entered.second)
-                Details::visit(*this, type, object);
-            else
-                head()[s_meta][s_reference] = idOf(entered.first->second);
+            // One that is held by value a second time stands a second time: it is another object after loading.
+            if (type.create)
+                m_places.try_emplace(Identity{object, &type}, Place{membersOfHead(), 0});
+            Details::visit(*this, type, object);
         });
     }
 
@@ -189,6 +202,7 @@ private:
     std::deque<json> m_nodes;
     std::unordered_map<Identity, Place, IdentityHash> m_places;
     std::size_t m_lastId = 0;
+    bool m_hasFailed = false;
 };
 
 oarchive::oarchive(json& root) : m_writer(std::make_unique<Writer>(root)) {}
@@ -202,6 +216,7 @@ json& oarchive::headRef()
 
 void oarchive::save_binary(const void* address, std::size_t count)
 {
+    requireByteCount(count);
     QByteArray bytes = QByteArray::fromRawData(static_cast<const char*>(address), static_cast<int>(count));
     m_writer->binary(bytes, bytes.size());
 }
@@ -219,6 +234,11 @@ void oarchive::begin(const char* key)
 void oarchive::end(const char* key)
 {
     m_writer->end(key);
+}
+
+void oarchive::abandon(const char*)
+{
+    m_writer->abandon();
 }
 
 void oarchive::number(qint64& value)

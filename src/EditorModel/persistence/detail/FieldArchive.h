@@ -12,6 +12,9 @@
 #include <boost/serialization/serialization.hpp>
 #include <boost/serialization/version.hpp>
 
+#include <stdexcept>
+#include <string>
+
 namespace Serialize::Details {
 
 /// What a visitor of field lists takes as one field, all the way down.
@@ -95,6 +98,10 @@ protected:
     {
         auto number = static_cast<qint64>(std::size_t(size));
         numberUnder(key, number);
+        if (number < 0)
+            throw std::runtime_error("a count of " + std::to_string(number) + " items");
+        // A body makes room for what is counted before it reads any of it.
+        self().checkCount(static_cast<std::size_t>(number));
         size = boost::serialization::collection_size_type(static_cast<std::size_t>(number));
     }
 
@@ -113,13 +120,17 @@ protected:
         } else if constexpr (std::is_arithmetic_v<T>) {
             std::conditional_t<std::is_floating_point_v<T>, double, qint64> number =
                 static_cast<decltype(number)>(value);
+            requireSame(value, number);
             numberUnder(key, number);
-            value = static_cast<T>(number);
+            if constexpr (is_loading::value) {
+                value = static_cast<T>(number);
+                requireSame(value, number);
+            }
         } else {
             static_assert(std::is_class_v<T>, "only persistent classes go through pointers");
-            self().begin(key);
-            boost::serialization::serialize_adl(self(), value, boost::serialization::version<T>::value);
-            self().end(key);
+            within(key, [&] {
+                boost::serialization::serialize_adl(self(), value, boost::serialization::version<T>::value);
+            });
         }
     }
 
@@ -131,9 +142,30 @@ private:
     template <class Number>
     void numberUnder(const char* key, Number& number)
     {
+        within(key, [&] { self().number(number); });
+    }
+
+    template <class Body>
+    void within(const char* key, Body body)
+    {
         self().begin(key);
-        self().number(number);
+        try {
+            body();
+        } catch (...) {
+            self().abandon(key);
+            throw;
+        }
         self().end(key);
+    }
+
+    /// A number that does not fit its other type is refused rather than cut.
+    template <class T, class Number>
+    static void requireSame(T value, Number number)
+    {
+        if constexpr (std::is_integral_v<T>) {
+            if (static_cast<Number>(value) != number || (value < T(0)) != (number < 0))
+                throw std::runtime_error("the number " + std::to_string(number) + " is out of range");
+        }
     }
 };
 
