@@ -127,7 +127,16 @@ class ClientArchives : public ::testing::Test
 {};
 
 using Forms = ::testing::Types<BinaryForm, XmlForm, JsonForm>;
-TYPED_TEST_SUITE(ClientArchives, Forms);
+struct FormNames
+{
+    template <class Form>
+    static std::string GetName(int)
+    {
+        return std::is_same_v<Form, BinaryForm> ? "Binary" : std::is_same_v<Form, XmlForm> ? "Xml" : "Json";
+    }
+};
+
+TYPED_TEST_SUITE(ClientArchives, Forms, FormNames);
 
 std::string withMossForLeaves(std::string text)
 {

@@ -6,6 +6,7 @@
 
 #include <gtest/gtest.h>
 
+#include <QCryptographicHash>
 #include <QTemporaryDir>
 
 #include <random>
@@ -52,7 +53,7 @@ protected:
             EXPECT_FALSE(documentOf({graph.roots().begin(), graph.roots().end()}, GetParam()).isEmpty());
             return false;
         } catch (const Document::Error& error) {
-            EXPECT_FALSE(error.form().empty());
+            EXPECT_STRNE(error.what(), "");
             EXPECT_FALSE(error.reason().empty());
             return true;
         }
@@ -139,17 +140,23 @@ TEST(DocumentError, TellsFormPlaceAndReason)
 {
     const Document::Error error("XML document", "objects[1]/path", "the text is not UTF-8");
     EXPECT_STREQ(error.what(), "XML document, at objects[1]/path: the text is not UTF-8");
-    EXPECT_STREQ(Document::Error("document", "", "it is empty").what(), "document: it is empty");
+    EXPECT_STREQ(Document::Error("", "", "the document is empty").what(), "the document is empty");
+    EXPECT_STREQ(Document::Error("a.json", "", "it is empty").what(), "a.json: it is empty");
 }
 
 TEST(DocumentError, WhatIsNoDocumentIsNamed)
 {
-    EXPECT_EQ(loadError(""), "document: it is empty");
-    EXPECT_EQ(loadError("hello"), "document: it is neither a binary nor an XML nor a Json document");
+    const std::string none = "this is neither a binary nor an XML nor a Json document";
+    EXPECT_EQ(loadError(""), "the document is empty");
+    EXPECT_EQ(loadError("hello"), none);
+    EXPECT_EQ(loadError("  \n "), none);
+    EXPECT_EQ(loadError("\x89PNG\r\n\x1A\n"), none);
     EXPECT_EQ(loadError("{\"a\": tru}"),
-              "Json document, at byte 10: this is no Json: it cannot be read on from here");
+              "Json document: this is no Json: it cannot be read on from line 1, column 10");
     EXPECT_EQ(loadError("{\"EditorModel\": \"archive\", \"version\": 7}"),
-              "Json document: it is of version 7, which is not known");
+              "Json document: its version is not 1");
+    EXPECT_EQ(loadError("{\"EditorModel\": \"archive\", \"version\": [1]}"),
+              "Json document: its version is not 1");
     EXPECT_EQ(loadError("{\"EditorModel\": \"archive\", \"version\": 1}"),
               "Json document, at objects: \"objects\" is missing");
 }
@@ -192,6 +199,97 @@ TEST(DocumentError, ThePlaceOfADamagedFieldIsItsWayOfKeys)
               "number is expected");
 }
 
+TEST(DocumentError, AWrongCountIsNamedWithItsContainer)
+{
+    Sample::Grove grove;
+    grove.litter.resize(1);
+    QByteArray document = documentOf({&grove}, allWays[2]);
+    const int count = document.indexOf("\"count\": 1", document.indexOf("\"litter\""));
+    document.replace(count, 10, "\"count\": 5");
+    EXPECT_EQ(loadError(document),
+              "Json document, at objects[1]/litter: there are 1 items where 5 are counted");
+}
+
+TEST(DocumentError, ObjectsThatNestTooDeepAreRefusedOnLoadingToo)
+{
+    std::string deep;
+    std::string end;
+    for (int level = 0; level < 20000; ++level) {
+        deep += "{\"$meta\": {\"class\": \"Sample::Bark\"}, \"rough\": false, \"next\": ";
+        end += '}';
+    }
+    const std::string text = "{\"EditorModel\": \"archive\", \"version\": 1, \"objects\": {\"count\": 1, "
+                             "\"item_version\": 0, \"item\": [" +
+                             deep + "null" + end + "]}}";
+    const std::string error = loadError(QByteArray::fromStdString(text));
+    EXPECT_NE(error.find("objects nest deeper than 1000 levels"), std::string::npos) << error;
+    EXPECT_EQ(error.find("Json document, at .../next/next/"), 0u) << error;
+    EXPECT_LT(error.size(), 500u);
+}
+
+TEST(DocumentError, AMarkOrBlanksMayStandInFront)
+{
+    const Sample::Leaf leaf(4, QStringLiteral("four"));
+    const QByteArray document = documentOf({&leaf}, allWays[2]);
+    EXPECT_EQ(graphOf(QByteArray(100, ' ') + document).rootAs<Sample::Leaf>()->number, 4);
+    EXPECT_EQ(graphOf("\xEF\xBB\xBF" + document).rootAs<Sample::Leaf>()->number, 4);
+}
+
+TEST(DocumentError, ADeviceThatIsNotOpenIsNamed)
+{
+    QBuffer closed;
+    try {
+        Document::load(closed);
+        FAIL() << "a closed device was read";
+    } catch (const Document::Error& error) {
+        EXPECT_STREQ(error.what(), "the device is not open for reading");
+    }
+}
+
+TEST(DocumentOrigin, ForeignDocumentsAreNeverGivenToBoost)
+{
+    const Sample::Leaf leaf(4, QStringLiteral("four"));
+    for (const Way& way : allWays) {
+        QByteArray document = documentOf({&leaf}, way);
+        QBuffer buffer(&document);
+        buffer.open(QIODevice::ReadOnly);
+        const bool isBoosts = way.route == Document::Archive && way.form != Document::Json;
+        try {
+            const auto graph = Document::load(buffer, Document::ForeignDocuments);
+            EXPECT_FALSE(isBoosts) << way.name;
+            EXPECT_EQ(graph.rootAs<Sample::Leaf>()->number, 4);
+        } catch (const Document::Error& error) {
+            EXPECT_TRUE(isBoosts) << way.name;
+            EXPECT_EQ(error.reason(), "an archive of this form is taken from oneself alone");
+        }
+    }
+}
+
+/// With a checksum that is right.
+TEST(DocumentError, AnXmlArchiveWithoutItsEndTagIsRefused)
+{
+    const auto sealed = [](const QByteArray& content) {
+        return content + "<!-- EditorModel archive: " + QByteArray::number(content.size()) +
+               " bytes, SHA-256 " + QCryptographicHash::hash(content, QCryptographicHash::Sha256).toHex() +
+               " -->\n";
+    };
+    const Sample::Leaf leaf;
+    const QByteArray document = documentOf({&leaf}, allWays[1]);
+    const QByteArray content = document.left(document.lastIndexOf("<!--"));
+    EXPECT_EQ(sealed(content), document);
+    EXPECT_EQ(loadError(sealed(content.left(content.lastIndexOf("</boost_serialization>")))),
+              "XML document: it is cut off: its end tag is missing");
+}
+
+TEST(DocumentError, ACommentLikeASealMakesNoArchive)
+{
+    const Sample::Leaf leaf(4, QStringLiteral("four"));
+    QByteArray document = documentOf({&leaf}, allWays[4]);
+    document.insert(document.lastIndexOf("</EditorModel>"),
+                    "<!-- EditorModel archive: 3 bytes, SHA-256 00 -->\n");
+    EXPECT_EQ(graphOf(document).rootAs<Sample::Leaf>()->number, 4);
+}
+
 TEST(DocumentFile, IsReplacedAsAWholeOrNotAtAll)
 {
     const QTemporaryDir folder;
@@ -214,8 +312,7 @@ TEST(DocumentFile, ErrorsNameTheFile)
         Document::loadFile(missing);
         FAIL() << "a missing file was loaded";
     } catch (const Document::Error& error) {
-        EXPECT_EQ(error.what(),
-                  missing.toStdString() + ": document: it cannot be read: No such file or directory");
+        EXPECT_EQ(error.what(), missing.toStdString() + ": it cannot be read: No such file or directory");
     }
     const Sample::Leaf leaf;
     EXPECT_THROW(

@@ -259,8 +259,9 @@ TEST(JsonArchive, ALongTextIsNotMultipliedByMentions)
 TEST(JsonArchive, CountsAndNumbersOfBodiesAreChecked)
 {
     std::vector<Client> clients;
-    EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": 500000000, "item_version": 0, "item": [1]}})"), clients),
-              "there are 1 items where 500000000 are counted");
+    EXPECT_EQ(
+        errorOf(json::parse(R"({"content": {"count": 500000000, "item_version": 0, "item": [1]}})"), clients),
+        "there are 1 items where 500000000 are counted");
     EXPECT_EQ(errorOf(json::parse(R"({"content": {"count": -1, "item_version": 0}})"), clients),
               "a count of -1 items");
     Client client;

@@ -38,6 +38,15 @@ TEST(ObjectTracker, TheSameObjectTwiceByValueIsRefused)
               "Object adressed by reference was already serialized by reference");
 }
 
+TEST(ObjectTracker, TheSameContainerTwiceByValueIsRefused)
+{
+    const std::deque<int> numbers = {1, 2};
+    object_tracker tracker;
+    tracker << make_nvp("first", numbers);
+    EXPECT_EQ(messageOf([&] { tracker << make_nvp("second", numbers); }),
+              "Object adressed by reference was already serialized by reference");
+}
+
 TEST(ObjectTracker, AnObjectByValueThatAPointerHeldIsRefused)
 {
     const Sample::Leaf leaf;

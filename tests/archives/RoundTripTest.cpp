@@ -228,6 +228,17 @@ TEST_P(EveryWay, ADequeOfThreeNestedObjectsComesBackInOrder)
     }
 }
 
+TEST_P(EveryWay, AListThatIsSharedStaysSharedWhileItIsSaved)
+{
+    const Sample::Leaf leaf;
+    Sample::Grove grove;
+    grove.list = {&leaf, &leaf};
+    const QList<const Sample::Leaf*> shared = grove.list;
+    const auto* const before = &std::as_const(grove.list).first();
+    documentOf({&grove}, GetParam());
+    EXPECT_EQ(&std::as_const(grove.list).first(), before);
+}
+
 TEST_P(EveryWay, PicturesComeBackSharedAndNull)
 {
     QImage image(2, 2, QImage::Format_ARGB32);

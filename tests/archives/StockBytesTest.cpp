@@ -110,7 +110,16 @@ class StockBytes : public ::testing::Test
 {};
 
 using Archives = ::testing::Types<boost::archive::binary_oarchive, boost::archive::xml_oarchive>;
-TYPED_TEST_SUITE(StockBytes, Archives);
+struct ArchiveNames
+{
+    template <class Archive>
+    static std::string GetName(int)
+    {
+        return std::is_same_v<Archive, boost::archive::binary_oarchive> ? "Binary" : "Xml";
+    }
+};
+
+TYPED_TEST_SUITE(StockBytes, Archives, ArchiveNames);
 
 TYPED_TEST(StockBytes, ARootHeldByValueIsStoredAlike)
 {

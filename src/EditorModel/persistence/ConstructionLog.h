@@ -39,6 +39,7 @@ public:
     /// Takes an object that was made of a type out of the current log: somebody else owns it.
     static void release(void* object);
 
+    std::size_t size() const { return m_made.size(); }
     /// Everything noted, in the order of making; the log is empty afterwards.
     std::vector<Made> take();
 

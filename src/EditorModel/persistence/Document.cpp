@@ -5,6 +5,7 @@
 #include <EditorModel/persistence/FailurePlace.h>
 #include <EditorModel/persistence/Frame.h>
 #include <EditorModel/persistence/Json.h>
+#include <EditorModel/persistence/JsonText.h>
 #include <EditorModel/persistence/Roots.h>
 #include <EditorModel/persistence/streams/Streams.h>
 
@@ -12,6 +13,7 @@
 #include <QFile>
 #include <QSaveFile>
 
+#include <cstring>
 #include <istream>
 #include <ostream>
 #include <streambuf>
@@ -73,7 +75,8 @@ const char* nameOf(Form form)
 
 std::string composed(const std::string& form, const std::string& place, const std::string& reason)
 {
-    return form + (place.empty() ? ": " : ", at " + place + ": ") + reason;
+    const std::string at = place.empty() ? form : form + ", at " + place;
+    return at.empty() ? reason : at + ": " + reason;
 }
 
 /// Runs `body`; whatever it throws becomes an `Error` with the place that the fields noted.
@@ -94,9 +97,6 @@ auto reported(const char* form, Body body, Position position) -> decltype(body()
         throw;
     } catch (const std::bad_cast&) {
         throw Error(form, place(), "an object of another class stands there");
-    } catch (const nlohmann::json::parse_error& error) {
-        throw Error(form, "byte " + std::to_string(error.byte),
-                    "this is no Json: it cannot be read on from here");
     } catch (const std::exception& error) {
         throw Error(form, place(), error.what());
     }
@@ -174,9 +174,8 @@ Graph graphOf(Read read)
     for (const Serialize::ISerializable* const root : stored)
         roots.push_back(const_cast<Serialize::ISerializable*>(root));
     std::vector<Graph::Owned> objects;
-    const auto made = log.take();
-    objects.reserve(made.size());
-    for (const auto& entry : made)
+    objects.reserve(log.size());
+    for (const auto& entry : log.take())
         objects.push_back({entry.object, entry.destroy});
     return Graph(std::move(roots), std::move(objects));
 }
@@ -205,54 +204,77 @@ Graph fromArchive(const QByteArray& content, void (*read)(std::istream&, Roots&)
     });
 }
 
-Graph fromBinary(const QByteArray& document)
+/// Boost's readers trust what they are given.
+void requireOwn(Origin origin)
+{
+    if (origin != OwnDocuments)
+        throw std::runtime_error("an archive of this form is taken from oneself alone");
+}
+
+Graph fromBinary(const QByteArray& document, Origin origin)
 {
     const auto content = reported(nameOf(Binary), [&] { return Details::unframed(document); });
     if (content.route == Stream)
         return fromStream(content.content, Binary);
-    return reported(nameOf(Binary),
-                    [&] { return fromArchive(content.content, &Serialize::Details::readBinaryArchive); });
+    return reported(nameOf(Binary), [&] {
+        requireOwn(origin);
+        return fromArchive(content.content, &Serialize::Details::readBinaryArchive);
+    });
 }
 
-Graph fromXml(const QByteArray& document)
+Graph fromXml(const QByteArray& document, Origin origin)
 {
     if (!Details::isXmlArchive(document))
         return fromStream(document, Xml);
     return reported(nameOf(Xml), [&] {
+        requireOwn(origin);
         return fromArchive(Details::unsealed(document), &Serialize::Details::readXmlArchive);
+    });
+}
+
+Graph fromJsonArchive(const QByteArray& document)
+{
+    const auto root = Details::parsedJson(document);
+    const auto version = root.find(versionKey);
+    if (version == root.end() || *version != jsonVersion)
+        throw std::runtime_error("its version is not " + std::to_string(jsonVersion));
+    return graphOf([&](Roots& roots) {
+        Serialize::Json::iarchive archive(root);
+        Serialize::Details::atRoots(
+            [&] { archive >> boost::serialization::make_nvp(Serialize::Details::rootsKey, roots); });
     });
 }
 
 Graph fromJson(const QByteArray& document)
 {
-    return reported(nameOf(Json), [&] {
-        const auto root = nlohmann::json::parse(document.begin(), document.end());
-        const auto route = root.find(routeKey);
-        if (route == root.end() || *route != archiveRoute)
-            return fromStream(document, Json);
-        if (root.value(versionKey, 0) != jsonVersion)
-            throw std::runtime_error("it is of version " + root.value(versionKey, nlohmann::json()).dump() +
-                                     ", which is not known");
-        return graphOf([&](Roots& roots) {
-            Serialize::Json::iarchive archive(root);
-            Serialize::Details::atRoots(
-                [&] { archive >> boost::serialization::make_nvp(Serialize::Details::rootsKey, roots); });
-        });
-    });
+    if (Details::jsonRoute(document, routeKey) != archiveRoute)
+        return fromStream(document, Json);
+    return reported(nameOf(Json), [&] { return fromJsonArchive(document); });
 }
 
-Graph graphOfDocument(const QByteArray& document)
+/// The first byte of what is said, behind blanks and a byte order mark.
+char firstOf(const QByteArray& document)
+{
+    int at = document.startsWith("\xEF\xBB\xBF") ? 3 : 0;
+    while (at < document.size() && std::strchr(" \t\r\n", document[at]))
+        ++at;
+    return at < document.size() ? document[at] : '\0';
+}
+
+Graph graphOfDocument(const QByteArray& document, Origin origin)
 {
     if (document.isEmpty())
-        throw Error("document", "", "it is empty");
+        throw Error("", "", "the document is empty");
     if (Details::hasFrame(document))
-        return fromBinary(document);
-    const QByteArray start = document.left(64).trimmed();
-    if (start.startsWith('<'))
-        return fromXml(document);
-    if (start.startsWith('{'))
+        return fromBinary(document, origin);
+    switch (firstOf(document)) {
+    case '<':
+        return fromXml(document, origin);
+    case '{':
         return fromJson(document);
-    throw Error("document", "", "it is neither a binary nor an XML nor a Json document");
+    default:
+        throw Error("", "", "this is neither a binary nor an XML nor a Json document");
+    }
 }
 
 /// Runs `body`; an error gets the file's name in front.
@@ -262,7 +284,8 @@ auto named(const QString& path, Body body) -> decltype(body())
     try {
         return body();
     } catch (const Error& error) {
-        throw Error(path.toStdString() + ": " + error.form(), error.place(), error.reason());
+        const std::string file = path.toStdString();
+        throw Error(error.form().empty() ? file : file + ": " + error.form(), error.place(), error.reason());
     }
 }
 
@@ -316,9 +339,11 @@ void save(QIODevice& device, const Serialize::ISerializable& root, Form form, Ro
     save(device, {&root}, form, route);
 }
 
-Graph load(QIODevice& device)
+Graph load(QIODevice& device, Origin origin)
 {
-    return graphOfDocument(device.readAll());
+    if (!device.isReadable())
+        throw Error("", "", "the device is not open for reading");
+    return graphOfDocument(device.readAll(), origin);
 }
 
 void saveFile(const QString& path, const std::deque<const Serialize::ISerializable*>& roots, Form form,
@@ -334,13 +359,13 @@ void saveFile(const QString& path, const std::deque<const Serialize::ISerializab
     });
 }
 
-Graph loadFile(const QString& path)
+Graph loadFile(const QString& path, Origin origin)
 {
     return named(path, [&] {
         QFile file(path);
         if (!file.open(QIODevice::ReadOnly))
-            throw Error("document", "", "it cannot be read: " + file.errorString().toStdString());
-        return load(file);
+            throw Error("", "", "it cannot be read: " + file.errorString().toStdString());
+        return load(file, origin);
     });
 }
 

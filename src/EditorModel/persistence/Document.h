@@ -35,11 +35,21 @@ enum Route : int
     Stream,
 };
 
+/// Who may have made a document that is to be loaded.
+enum Origin : int
+{
+    /// Oneself: every form and route is read.
+    OwnDocuments,
+    /// Anybody: binary and XML archives are refused, whose readers cannot withstand malice.
+    ForeignDocuments,
+};
+
 /// What was wrong with a document, and where.
 class EDITORMODEL_EXPORT Error : public std::runtime_error
 {
 public:
-    /// `place` is the way of keys from the root to the field, a position in the text, or empty.
+    /// `place` is the way of keys from the root to the field, a position in the text, or empty; so is `form`
+    /// where it is not known.
     Error(const std::string& form, const std::string& place, const std::string& reason);
     ~Error() override;
 
@@ -96,15 +106,15 @@ EDITORMODEL_EXPORT void save(QIODevice& device, const std::deque<const Serialize
 EDITORMODEL_EXPORT void save(QIODevice& device, const Serialize::ISerializable& root, Form form,
                              Route route = Archive);
 
-/// Reads a document up to the end of the device; its form and route are recognised. Throws `Error`, and then
-/// everything that was made is freed.
-EDITORMODEL_EXPORT Graph load(QIODevice& device);
+/// Reads a document up to the end of an open device; its form and route are recognised. Throws `Error`, and
+/// then everything that was made is freed.
+EDITORMODEL_EXPORT Graph load(QIODevice& device, Origin origin = OwnDocuments);
 
 /// The same with files; a file is replaced as a whole or not at all. An error names the file as well.
 EDITORMODEL_EXPORT void saveFile(const QString& path,
                                  const std::deque<const Serialize::ISerializable*>& roots, Form form,
                                  Route route = Archive);
-EDITORMODEL_EXPORT Graph loadFile(const QString& path);
+EDITORMODEL_EXPORT Graph loadFile(const QString& path, Origin origin = OwnDocuments);
 
 /// By the ending of the name, in any case: .bin, .xml, .json; none for any other.
 EDITORMODEL_EXPORT std::optional<Form> formOfPath(const QString& path);

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/persistence/Fields.h>
 
-#include <EditorModel/persistence/archives/Registration.h>
 #include <EditorModel/persistence/FailurePlace.h>
 #include <EditorModel/persistence/Roots.h>
+#include <EditorModel/persistence/archives/Registration.h>
 
 #include <cstring>
 #include <stdexcept>
@@ -13,6 +13,8 @@
 namespace Serialize {
 namespace Details {
 namespace {
+
+constexpr std::size_t longestPlace = 300;
 
 thread_local std::string failurePlace;
 thread_local int depth = 0;
@@ -54,6 +56,12 @@ void FailurePlace::clear()
 
 void FailurePlace::add(const char* key, int item)
 {
+    // Of a way that is longer than a reader wants, the end says most.
+    if (failurePlace.size() > longestPlace) {
+        if (failurePlace.compare(0, 4, ".../") != 0)
+            failurePlace.insert(0, ".../");
+        return;
+    }
     std::string step = item > 0 ? "[" + std::to_string(item) + "]" : std::string(key);
     if (!failurePlace.empty() && failurePlace.front() != '[')
         step += '/';
@@ -81,7 +89,7 @@ Pointee pointee(const void* object, const std::type_info& info, const Type* gues
 void visit(Fields& fields, const Type& type, void* object)
 {
     const DepthGuard guard(depth);
-    const Fields::Position outer = fields.m_position;
+    const Fields::Position outer = std::exchange(fields.m_position, {});
     try {
         type.visit(fields, object);
     } catch (...) {

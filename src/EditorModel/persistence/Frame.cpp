@@ -11,6 +11,7 @@ namespace {
 constexpr char signature[] = "\x89"
                              "EDM\r\n\x1A\n";
 constexpr int signatureLength = 8;
+constexpr int nameLength = 4;
 constexpr char frameVersion = 1;
 constexpr int digestLength = 32;
 constexpr int lengthOffset = signatureLength + 2;
@@ -59,7 +60,8 @@ QByteArray framed(const QByteArray& content, Route route)
 
 bool hasFrame(const QByteArray& document)
 {
-    return !document.isEmpty() && document.front() == signature[0];
+    // What changes line ends changes the signature as well; its name is enough to know what was meant.
+    return document.startsWith(QByteArray::fromRawData(signature, nameLength));
 }
 
 Unframed unframed(const QByteArray& document)
@@ -97,13 +99,17 @@ QByteArray unsealed(const QByteArray& document)
     // Written anew, the seal must be the same to the last byte.
     if (sealed(content) != document)
         throwDamaged();
+    // The archive's reader ends the process where the end tag is missing.
+    if (!content.trimmed().endsWith("</boost_serialization>"))
+        throw std::runtime_error("it is cut off: its end tag is missing");
     return content;
 }
 
 bool isXmlArchive(const QByteArray& document)
 {
+    const int lastLine = document.lastIndexOf('\n', document.size() - 2) + 1;
     return document.left(256).contains("<!DOCTYPE boost_serialization>") ||
-           document.lastIndexOf(sealBegin) >= 0;
+           document.mid(lastLine).startsWith(sealBegin);
 }
 
 } // namespace Document::Details

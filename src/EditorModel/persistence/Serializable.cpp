@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/persistence/Serializable.h>
+#include <EditorModel/persistence/Type.h>
 
 #include <map>
 #include <stdexcept>
@@ -24,7 +25,13 @@ BaseCreator::~BaseCreator() = default;
 
 Registrator::Registrator(const char* const name, const BaseCreator* const creator)
 {
-    if (!table().emplace(name, creator).second)
+    Details::requireFreeName(name);
+    table().emplace(name, creator);
+}
+
+void Details::requireFreeName(const char* name)
+{
+    if (table().count(name) != 0)
         throw std::logic_error("the archive name \"" + std::string(name) + "\" is registered twice");
 }
 

@@ -90,11 +90,15 @@ void enterCast()
     CastEntry{Derived::persistentType(), typeid(Base), &upcast<Derived, Base>, &downcast<Derived, Base>};
 }
 
+/// Throws `std::logic_error` where another class has the name; two such classes cannot be in one process.
+EDITORMODEL_EXPORT void requireFreeName(const char* name);
+
 /// Enters a registered class with its persistent bases, the root among them; gives its name, so that a
 /// registrator can do this first.
 template <class T, class... Bases>
 const char* enter()
 {
+    requireFreeName(T::persistentType().name);
     TypeEntry{T::persistentType()};
     (enterCast<T, Bases>(), ...);
     return T::persistentType().name;

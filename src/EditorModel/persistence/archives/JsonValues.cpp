@@ -44,8 +44,8 @@ void requireItems(const nlohmann::json& collection, std::size_t count)
     const auto items = collection.find(Details::itemKey.archive);
     const std::size_t stored = items == collection.end() || !items->is_array() ? 0 : items->size();
     if (count != stored)
-        throw std::runtime_error("there are " + std::to_string(stored) + " items where " + std::to_string(count) +
-                                 " are counted");
+        throw std::runtime_error("there are " + std::to_string(stored) + " items where " +
+                                 std::to_string(count) + " are counted");
 }
 
 void requireByteCount(std::size_t count)

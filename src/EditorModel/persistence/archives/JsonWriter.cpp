@@ -4,8 +4,8 @@
 #include <EditorModel/persistence/archives/Pictures.h>
 
 #include <deque>
-#include <stdexcept>
 #include <limits>
+#include <stdexcept>
 #include <unordered_map>
 
 namespace Serialize::Json {
@@ -123,7 +123,8 @@ private:
     {
         within(key.archive, [&] {
             head() = json::object();
-            // One that is held by value a second time stands a second time: it is another object after loading.
+            // One that is held by value a second time stands a second time: it is another object after
+            // loading.
             if (type.create)
                 m_places.try_emplace(Identity{object, &type}, Place{membersOfHead(), 0});
             Details::visit(*this, type, object);

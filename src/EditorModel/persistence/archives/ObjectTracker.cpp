@@ -27,7 +27,10 @@ private:
             throw std::runtime_error("Reference to object on heap is not allowed");
     }
 
-    void onObject(const Key&, const Type& type, void* object) override
+    void onObject(const Key&, const Type& type, void* object) override { walkValue(type, object); }
+    void onContainer(const Key&, const Type& type, void* container) override { walkValue(type, container); }
+
+    void walkValue(const Type& type, void* object)
     {
         Record& record = m_records[object];
         if (record.kind == NotSeen) {
@@ -61,11 +64,7 @@ private:
         record.saved = true;
     }
 
-    void onContainer(const Key&, const Type& type, void* container) override
-    {
-        Details::visit(*this, type, container);
-    }
-
+    /// The entry of a map is a copy that lives for this call.
     void onEntry(const Type& pair, void* entry) override { Details::visit(*this, pair, entry); }
 
     int onBeginSequence(SequenceKind, int count) override { return count; }

@@ -151,14 +151,15 @@ void visitSequence(Fields& fields, C& container, SequenceKind kind)
     const int count = fields.beginSequence(kind, static_cast<int>(container.size()));
     if (fields.loading())
         container.clear();
-    auto position = container.begin();
+    // Through a constant: a Qt container that is shared must not become one of its own by being looked at.
+    auto position = std::as_const(container).begin();
     for (int index = 1; index <= count; ++index) {
         fields.beginItem(index);
         if (fields.loading()) {
             container.push_back({});
             fields(itemKey, container.back());
         } else {
-            fields(itemKey, *position++);
+            fields(itemKey, const_cast<typename C::value_type&>(*position++));
         }
         fields.endItem(index);
     }

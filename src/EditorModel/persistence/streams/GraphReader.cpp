@@ -2,9 +2,9 @@
 #include <EditorModel/persistence/streams/GraphReader.h>
 
 #include <EditorModel/persistence/ConstructionLog.h>
-#include <EditorModel/persistence/archives/Pictures.h>
 #include <EditorModel/persistence/Serializable.h>
 #include <EditorModel/persistence/Utf8.h>
+#include <EditorModel/persistence/archives/Pictures.h>
 #include <EditorModel/types/Image.h>
 
 #include <new>

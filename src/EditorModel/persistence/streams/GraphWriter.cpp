@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/persistence/streams/GraphWriter.h>
 
-#include <EditorModel/persistence/archives/Pictures.h>
 #include <EditorModel/persistence/Serializable.h>
 #include <EditorModel/persistence/Type.h>
 #include <EditorModel/persistence/Unregistered.h>
+#include <EditorModel/persistence/archives/Pictures.h>
 #include <EditorModel/types/Image.h>
 
 #include <stdexcept>

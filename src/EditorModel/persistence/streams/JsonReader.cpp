@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/persistence/Json.h>
+#include <EditorModel/persistence/JsonText.h>
 #include <EditorModel/persistence/Utf8.h>
 #include <EditorModel/persistence/streams/Forms.h>
 #include <EditorModel/persistence/streams/JsonNames.h>
@@ -38,11 +39,7 @@ class JsonReader final : public FormReader
 public:
     explicit JsonReader(const QByteArray& document)
     {
-        try {
-            m_root = Node::parse(document.begin(), document.end());
-        } catch (const Node::exception& error) {
-            throw std::runtime_error(error.what());
-        }
+        m_root = Document::Details::parsedJson(document);
         if (!m_root.is_object())
             throwUnexpected("an object", describe(m_root));
         m_open.push_back({&m_root, {}, {}, 0});
