@@ -5,6 +5,10 @@
 #include <EditorModel/persistence/Roots.h>
 #include <EditorModel/persistence/archives/Registration.h>
 
+#if defined(__unix__)
+#include <dlfcn.h>
+#endif
+
 #include <cstring>
 #include <stdexcept>
 #include <typeindex>
@@ -33,6 +37,19 @@ struct DepthGuard
 
     int& level;
 };
+
+/// The tables of classes, Boost's among them, keep addresses in the module that a class came in: it stays.
+void keepLoaded([[maybe_unused]] const void* address)
+{
+#if defined(__unix__)
+    static const void* lastModule = nullptr;
+    Dl_info module;
+    if (dladdr(address, &module) == 0 || module.dli_fbase == lastModule)
+        return;
+    lastModule = module.dli_fbase;
+    dlopen(module.dli_fname, RTLD_LAZY | RTLD_NOLOAD | RTLD_NODELETE);
+#endif
+}
 
 /// Entered classes, by what they are looked up by. Never destroyed, as static destructors may still save.
 struct Classes
@@ -75,6 +92,7 @@ const std::string& FailurePlace::text()
 
 TypeEntry::TypeEntry(const Type& type)
 {
+    keepLoaded(&type);
     classes().byInfo.emplace(type.info, &type);
     if (type.exported)
         classes().byName.emplace(type.name, &type);

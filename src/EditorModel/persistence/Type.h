@@ -55,8 +55,8 @@ EDITORMODEL_EXPORT const Type* findType(const std::string& name);
 
 namespace Details {
 
-/// Enters a class for look-up by its `typeid` and its export key. Constructed statically in the class's
-/// source.
+/// Enters a class for look-up by its `typeid` and its export key, for the life of the process: a module with
+/// such a class stays loaded. Constructed statically in the class's source.
 class EDITORMODEL_EXPORT TypeEntry
 {
 public:
