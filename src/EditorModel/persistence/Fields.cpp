@@ -51,7 +51,8 @@ void keepLoaded([[maybe_unused]] const void* address)
 #endif
 }
 
-/// Entered classes, by what they are looked up by. Never destroyed, as static destructors may still save.
+/// Entered classes, by what they are looked up by. Written by static initialisers alone, which the loader
+/// runs one at a time; never destroyed, as static destructors may still save.
 struct Classes
 {
     std::unordered_map<std::type_index, const Type*> byInfo;
