@@ -11,6 +11,8 @@ namespace {
 
 using PubSub::Details::PointerMap;
 
+static_assert(noexcept(PointerMap<int>().remove(nullptr)));
+
 const void* address(quintptr value)
 {
     return reinterpret_cast<const void*>(value * 16);

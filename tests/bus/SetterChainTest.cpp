@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "TracedView.h"
 
+#include <EditorModel/media/Media.h>
+#include <EditorModel/services/Report.h>
 #include <EditorModel/services/Task.h>
 
 #include <stdexcept>
@@ -16,6 +18,13 @@ using Chain = Message::View<Note>::SetterChain;
 static_assert(std::is_move_constructible_v<Chain> && !std::is_copy_constructible_v<Chain>);
 static_assert(!std::is_copy_assignable_v<Chain> && !std::is_move_assignable_v<Chain>);
 static_assert(!std::is_nothrow_destructible_v<Chain>);
+
+// Their changes are moved in, and none can fail half-way.
+static_assert(std::is_nothrow_move_assignable_v<Task::Object>);
+static_assert(std::is_nothrow_move_assignable_v<Report::Progress>);
+static_assert(std::is_nothrow_move_assignable_v<Media::Audio>);
+static_assert(std::is_nothrow_move_assignable_v<Media::Video>);
+static_assert(std::is_nothrow_move_assignable_v<Media::File>);
 
 TEST_F(ViewTest, AChainCommitsAtTheEndOfItsStatement)
 {
@@ -245,6 +254,71 @@ TEST(SetterChain, TheAssignmentOfAnObjectDecidesWhatSurvivesAChange)
     }
     EXPECT_EQ(object.text, "moved");
     EXPECT_EQ(object.place, "here");
+}
+
+TEST(SetterChain, TheAssignmentOfAnObjectDecidesWhatSurvivesARequest)
+{
+    struct Recorder : Message::View<Anchored>
+    {
+        void changed(const Anchored*, const Anchored* oldValue) override { oldText = oldValue->text; }
+        using View::changed;
+        std::string oldText;
+    };
+    Anchored object;
+    object.text = "before";
+    object.place = "a place whose name is too long to lie within the string";
+    const std::string place = object.place;
+    Recorder owner;
+    Message::View<Anchored> client;
+    owner.own(&object);
+    client.observe(&object);
+    client.change(&object)->text = "after";
+    EXPECT_EQ(object.text, "after");
+    EXPECT_EQ(object.place, place);
+    EXPECT_EQ(owner.oldText, "before");
+}
+
+/// Cannot be made from another by a move, or be assigned one where that may fail too.
+template <bool assignable>
+struct Rigid : virtual PubSub::Object
+{
+    Rigid() = default;
+    Rigid(const Rigid&) = default;
+    Rigid(Rigid&& other) : PubSub::Object(other), text(std::move(other.text))
+    {
+        throw std::runtime_error("move construction");
+    }
+    Rigid& operator=(const Rigid&) = default;
+    Rigid& operator=(Rigid&& other) noexcept(assignable)
+    {
+        text = std::move(other.text);
+        if constexpr (!assignable) {
+            throw std::runtime_error("move assignment");
+        }
+        return *this;
+    }
+
+    std::string text;
+};
+
+template <typename T>
+void expectChangesToSucceed()
+{
+    T object;
+    object.text = "a text that is too long to lie within the string";
+    Message::View<T> owner, client;
+    owner.own(&object);
+    client.observe(&object);
+    EXPECT_NO_THROW(owner.change(&object)->text += ", changed by its owner");
+    EXPECT_EQ(object.text, "a text that is too long to lie within the string, changed by its owner");
+    EXPECT_NO_THROW(client.change(&object)->text = "requested");
+    EXPECT_EQ(object.text, "requested");
+}
+
+TEST(SetterChain, AChangeDoesNotDependOnAMoveThatMayFail)
+{
+    expectChangesToSucceed<Rigid<true>>();
+    expectChangesToSucceed<Rigid<false>>();
 }
 
 TEST(SetterChain, LeavesTheValueOfAnOwnersChainDefault)

@@ -222,6 +222,9 @@ protected:
     void previewChanged(const Note*, const Note*, const Note*) override { lines.push_back("changed 3"); }
     void previewChanged(const Note*, const Note*) override { lines.push_back("changed 2"); }
     void previewChanged(const Note*) override { lines.push_back("changed 1"); }
+    void addRequested(Note*) override { lines.push_back("add requested"); }
+    void changeRequested(Note*, Note*) override { lines.push_back("change requested"); }
+    void removeRequested(Note*) override { lines.push_back("remove requested"); }
 };
 
 /// Modules that were built apart meet in these tables: the destructor has two entries, then come added,
@@ -236,6 +239,12 @@ TEST(TypedView, ItsVirtualFunctionsKeepTheirPlaces)
     slots.call(5, &note);
     slots.call(6, &note);
     EXPECT_THAT(slots.lines, ElementsAre("added", "changed 3", "changed 2", "changed 1", "removed"));
+    slots.lines.clear();
+    Note writable;
+    slots.call(7, &writable);
+    slots.call(8, &writable, &writable);
+    slots.call(9, &writable);
+    EXPECT_THAT(slots.lines, ElementsAre("add requested", "change requested", "remove requested"));
     slots.lines.clear();
     slots.call(10, &note);
     slots.call(11, &note);

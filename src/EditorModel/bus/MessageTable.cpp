@@ -11,7 +11,7 @@ quint64 MessageTable::registerSubscriber(void* subscriber, const SubscriberBase&
     return m_lastSerial;
 }
 
-void MessageTable::unregisterSubscriber(const void* subscriber)
+void MessageTable::unregisterSubscriber(const void* subscriber) noexcept
 {
     m_registrations.remove(subscriber);
 }
@@ -21,7 +21,7 @@ void MessageTable::subscribe(const Recipient& recipient, const Object* object)
     m_bySender.add(object).add(recipient);
 }
 
-void MessageTable::unsubscribe(const Recipient& recipient, const Object* object)
+void MessageTable::unsubscribe(const Recipient& recipient, const Object* object) noexcept
 {
     ++m_state.removals;
     m_bySender.removeIf(object, [&](RecipientList& recipients) {
@@ -35,20 +35,31 @@ void MessageTable::subscribeAll(const Recipient& recipient, const std::type_inde
     all(objectType).add(recipient);
 }
 
-void MessageTable::unsubscribeAll(const Recipient& recipient, const std::type_index& objectType)
+/// Without a list of the type nobody is in it, as where the first subscription failed.
+void MessageTable::unsubscribeAll(const Recipient& recipient, const std::type_index& objectType) noexcept
 {
     ++m_state.removals;
-    all(objectType).remove(recipient.subscriber);
+    if (RecipientList* recipients = findAll(objectType)) {
+        recipients->remove(recipient.subscriber);
+    }
 }
 
 RecipientList& MessageTable::all(const std::type_index& objectType)
 {
-    for (const auto& [type, recipients] : m_byType) {
-        if (type == objectType) {
-            return *recipients;
-        }
+    if (RecipientList* recipients = findAll(objectType)) {
+        return *recipients;
     }
     return *m_byType.emplace_back(objectType, std::make_unique<RecipientList>()).second;
+}
+
+RecipientList* MessageTable::findAll(const std::type_index& objectType) const noexcept
+{
+    for (const auto& [type, recipients] : m_byType) {
+        if (type == objectType) {
+            return recipients.get();
+        }
+    }
+    return nullptr;
 }
 
 /// The way to a single recipient or to none calls nothing.

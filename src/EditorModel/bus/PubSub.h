@@ -23,8 +23,8 @@ class EDITORMODEL_EXPORT Object
 {
 public:
     Object() = default;
-    Object(const Object&) {}
-    Object& operator=(const Object&) { return *this; }
+    Object(const Object&) noexcept {}
+    Object& operator=(const Object&) noexcept { return *this; }
     virtual ~Object() = default;
 };
 
@@ -72,7 +72,8 @@ public:
     /// Leaves the bus: nothing reaches this subscriber afterwards, also not from a running publication.
     virtual ~SubscriberBase();
 
-    /// Subscriptions are not counted: one unsubscribe() undoes any number of calls. Null is ignored.
+    /// Subscriptions are not counted: one unsubscribe() undoes any number of calls. Null is ignored. Where
+    /// the memory for a subscription is missing there is none; leaving needs no memory.
     void subscribe(const Object* object);
     void unsubscribe(const Object* object);
     bool isSubscribed(const Object* object) const;

@@ -19,7 +19,7 @@ void RecipientList::addToRest(const Recipient& recipient)
     }
 }
 
-void RecipientList::removeFromMany(const void* subscriber)
+void RecipientList::removeFromMany(const void* subscriber) noexcept
 {
     const std::size_t found = position(subscriber);
     if (found == size()) {
@@ -37,7 +37,7 @@ void RecipientList::removeFromMany(const void* subscriber)
 }
 
 /// Where the subscriber stands; size() if it does not.
-std::size_t RecipientList::position(const void* subscriber)
+std::size_t RecipientList::position(const void* subscriber) noexcept
 {
     if (m_positions) {
         const std::size_t* found = m_positions->find(subscriber);

@@ -22,12 +22,14 @@
 /// values; its callbacks are declared behind. A client that overrides one fileChanged() hides the other two:
 /// it says `using FileViewBase::fileChanged;` if it wants to call them.
 ///
-/// Type may depend on a template parameter of the class. Inside the macro's class and below it, the bare name
-/// View means the private base; write ::Message::View<X> in full for another one.
+/// Type may depend on a template parameter of the class. The macro leaves the class in `private:`. Inside the
+/// macro's class and below it, the bare name View means the private base; write ::Message::View<X> in full
+/// for another one.
 ///
 /// A base whose T stands in a library is compiled once, if its header has
-/// `extern template class EDITORMODEL_EXPORT Message::View<T>;` in front of the first class that uses it, and
-/// one source has `template class EDITORMODEL_EXPORT Message::View<T>;`. T must be complete in both places.
+/// `extern template class YOUR_EXPORT Message::View<T>;`, with your library's export macro, in front of the
+/// first class that uses it, and one source has `template class Message::View<T>;`. T must be complete in
+/// both places.
 #define EDITORMODEL_TYPED_VIEW(Type, prefix)                                                                 \
 protected:                                                                                                   \
     const Type* prefix() const                                                                               \

@@ -19,11 +19,15 @@ namespace Message {
 /// view has it. Observers read the owner's object itself.
 ///
 /// T is default-constructible, copyable, assignable and derives virtually from PubSub::Object. A
-/// default-constructed T stands for "no value" where an object arrives or departs.
+/// default-constructed T stands for "no value" where an object arrives or departs. Its moves do what its
+/// copies do: values are moved where T's move assignment is noexcept, and copied otherwise. So an assignment
+/// that leaves part of its object in place must not be noexcept.
 ///
 /// All views of one T belong to one thread. A request has been carried out and announced when the operation
 /// returns, and it is lost, silently, if the object has no owner. Callbacks may use this and other views in
-/// turn, but must not destroy the view that calls them. Where null is not given a meaning it is ignored.
+/// turn, but must not destroy the view that calls them. What a callback throws passes through the operation,
+/// and the steps behind it, the announcement to others among them, are not done. Where null is not given a
+/// meaning it is ignored.
 template <typename T>
 class View
 {
@@ -48,7 +52,8 @@ public:
     /// is to be owned or observed here. Null stands for the first object of the view; if there is none, the
     /// end of the chain adds the chain's own value, whose address is good for nothing afterwards.
     SetterChain change(const T* object);
-    /// Ends the sharing of the object. It is to be owned or observed here; null stands for the first one.
+    /// Ends the sharing of the object. It is to be owned or observed here; null stands for the first one. On
+    /// an empty view null reaches nobody.
     void remove(const T* object);
     /// Drops the object here and tells nobody else. Its owner, if it was this view, is not replaced.
     void forget(const T* object);
@@ -86,7 +91,8 @@ protected:
     virtual void removed(const T* object);
 
     /// The owner's side of a request. A replacement may adjust or refuse it; to grant it, it ends in a call
-    /// of the one it replaces.
+    /// of the one it replaces. Requests to change or remove an object that was forgotten or is only observed
+    /// by now don't get here.
     virtual void addRequested(T* object);
     /// `value` is the owner's to use up: it holds the old value afterwards.
     virtual void changeRequested(T* object, T* value);

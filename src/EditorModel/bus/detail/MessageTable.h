@@ -17,12 +17,12 @@ public:
     /// Returns the serial number of the registration.
     quint64 registerSubscriber(void* subscriber, const SubscriberBase& base);
     /// The subscriber has left all lists before, which is what running publications take note of.
-    void unregisterSubscriber(const void* subscriber);
+    void unregisterSubscriber(const void* subscriber) noexcept;
 
     void subscribe(const Recipient& recipient, const Object* object);
-    void unsubscribe(const Recipient& recipient, const Object* object);
+    void unsubscribe(const Recipient& recipient, const Object* object) noexcept;
     void subscribeAll(const Recipient& recipient, const std::type_index& objectType);
-    void unsubscribeAll(const Recipient& recipient, const std::type_index& objectType);
+    void unsubscribeAll(const Recipient& recipient, const std::type_index& objectType) noexcept;
 
     /// The recipients that subscribed to all objects of the type. Stays in place.
     RecipientList& all(const std::type_index& objectType);
@@ -37,6 +37,7 @@ private:
         const SubscriberBase* base = nullptr;
     };
 
+    RecipientList* findAll(const std::type_index& objectType) const noexcept;
     Snapshot snapshotOfOne(const RecipientList& recipients);
     Snapshot snapshotOfBoth(const Object* sender, const RecipientList& some, const RecipientList& all);
     void push(const RecipientList& recipients);

@@ -5,6 +5,8 @@
 
 #include <cstddef>
 #include <memory>
+#include <new>
+#include <type_traits>
 #include <utility>
 
 namespace PubSub::Details {
@@ -13,7 +15,8 @@ namespace PubSub::Details {
 /// the Qt hashes allocate for every entry costs more than all the rest of a subscription; here nothing is
 /// allocated while the number of entries moves within a factor of eight.
 ///
-/// Value is default-constructible and movable. References to values are invalid after add() and remove().
+/// Value is default-constructible and movable, both without a failure. References to values are invalid after
+/// add() and remove(). Only entering a key can fail, with bad_alloc; the map is then as it was.
 template <typename Value>
 class PointerMap
 {
@@ -43,14 +46,15 @@ public:
         return m_size != before;
     }
 
-    bool remove(const void* key)
+    bool remove(const void* key) noexcept
     {
         return removeIf(key, [](const Value&) { return true; });
     }
 
-    /// Removes the entry of the key if there is one and done(value), which may change it, says so.
+    /// Removes the entry of the key if there is one and done(value), which may change it but not throw, says
+    /// so.
     template <typename Done>
-    bool removeIf(const void* key, Done done)
+    bool removeIf(const void* key, Done done) noexcept
     {
         if (m_size == 0) {
             return false;
@@ -61,9 +65,7 @@ public:
         }
         closeGap(found);
         --m_size;
-        if (m_capacity > minimum && m_size * 16 < m_capacity) {
-            rehash(m_capacity / 4 > minimum ? m_capacity / 4 : minimum);
-        }
+        shrink();
         return true;
     }
 
@@ -79,6 +81,8 @@ public:
     }
 
 private:
+    static_assert(std::is_nothrow_move_assignable_v<Value>);
+
     struct Slot
     {
         const void* key = nullptr;
@@ -130,6 +134,19 @@ private:
         m_slots[gap] = Slot();
     }
 
+    /// Without the memory for it the map stays large: whoever leaves must get away.
+    void shrink() noexcept
+    {
+        if (m_capacity == minimum || m_size * 16 >= m_capacity) {
+            return;
+        }
+        try {
+            rehash(m_capacity / 4 > minimum ? m_capacity / 4 : minimum);
+        } catch (const std::bad_alloc&) {
+        }
+    }
+
+    /// Nothing has moved yet where the allocation fails.
     void rehash(std::size_t capacity)
     {
         auto slots = std::make_unique<Slot[]>(capacity);

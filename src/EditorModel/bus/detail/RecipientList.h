@@ -47,7 +47,7 @@ public:
     }
 
     /// A subscriber that is not in the list is ignored.
-    void remove(const void* subscriber)
+    void remove(const void* subscriber) noexcept
     {
         if (isLong()) {
             removeFromMany(subscriber);
@@ -57,10 +57,10 @@ public:
     }
 
 private:
-    Recipient& at(std::size_t position) { return position ? m_rest[position - 1] : m_first; }
-    std::size_t position(const void* subscriber);
+    Recipient& at(std::size_t position) noexcept { return position ? m_rest[position - 1] : m_first; }
+    std::size_t position(const void* subscriber) noexcept;
     void addToRest(const Recipient& recipient);
-    void removeFromMany(const void* subscriber);
+    void removeFromMany(const void* subscriber) noexcept;
     void index();
 
     Recipient m_first{nullptr, 0};

@@ -7,6 +7,48 @@
 
 namespace Message {
 
+namespace Details {
+
+/// Moving cannot fail half-way and leave an owner's object without its contents.
+template <typename T>
+constexpr bool isMovedSafely = std::is_nothrow_move_assignable_v<T>;
+
+/// What replaceValue() can put the old value of the object into. May throw, and touches nothing.
+template <typename T>
+T placeForOldValue(const T& object)
+{
+    if constexpr (isMovedSafely<T>) {
+        return T();
+    } else {
+        return T(object);
+    }
+}
+
+/// Gives the object the value, and `old`, which is from placeForOldValue(), what the object was.
+template <typename T>
+void replaceValue(T& object, T& value, T& old)
+{
+    if constexpr (isMovedSafely<T>) {
+        old = std::move(object);
+        object = std::move(value);
+    } else {
+        object = std::as_const(value);
+    }
+}
+
+/// Assigns the value, which is good for nothing afterwards.
+template <typename T>
+void assignLast(T& object, T& value)
+{
+    if constexpr (isMovedSafely<T>) {
+        object = std::move(value);
+    } else {
+        object = std::as_const(value);
+    }
+}
+
+} // namespace Details
+
 // Construction and end
 
 template <typename T>
@@ -255,7 +297,9 @@ void View<T>::addRequested(T* object)
 template <typename T>
 void View<T>::changeRequested(T* object, T* value)
 {
-    std::swap(*object, *value);
+    T old = Details::placeForOldValue(*object);
+    Details::replaceValue(*object, *value, old);
+    Details::assignLast(*value, old);
     announceChange(object, value);
     PubSub::publish(Types::Changed<T>(object, value));
 }
@@ -273,20 +317,24 @@ void View<T>::removeRequested(T* object)
 template <typename T>
 void View<T>::take(T* object)
 {
+    if (!object) {
+        return;
+    }
     m_objects[object] = object;
     announceArrival(object);
     m_owner.subscribe(object);
     PubSub::publish(Types::Added<T>(object));
 }
 
-/// Leaves a default-constructed T in `value`. The old value is moved out and the new one moved in: a T of its
-/// own assignment, which may leave some of it in place, has no moves and is copied.
+/// Leaves a default-constructed T in `value`. All that a T of safe moves can fail to construct is there
+/// before the object is touched.
 template <typename T>
 void View<T>::commit(T* object, T* value)
 {
-    const T old = std::move(*object);
-    *object = std::move(*value);
-    *value = T();
+    T none{};
+    T old = Details::placeForOldValue(*object);
+    Details::replaceValue(*object, *value, old);
+    Details::assignLast(*value, none);
     announceChange(object, &old);
     PubSub::publish(Types::Changed<T>(object, &old));
 }
@@ -296,12 +344,17 @@ void View<T>::commit(T* object, T* value)
 template <typename T>
 void View<T>::notify(const Types::Add<T>& message)
 {
-    addRequested(message.object);
+    if (message.object) {
+        addRequested(message.object);
+    }
 }
 
 template <typename T>
 void View<T>::notify(const Types::Added<T>& message)
 {
+    if (!message.sender) {
+        return;
+    }
     m_observer.subscribe(message.sender);
     m_objects[message.sender] = nullptr;
     announceArrival(message.sender);
@@ -404,7 +457,7 @@ template <typename T>
 void View<T>::Owner::Adder::notify(const Types::Add<T>& message)
 {
     if (!view->m_owner.isSubscribed(message.object)) {
-        view->addRequested(message.object);
+        view->notify(message);
     }
 }
 
