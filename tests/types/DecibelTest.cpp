@@ -106,6 +106,11 @@ TEST(DecibelEquality, IsNoneForSilence)
     EXPECT_FALSE(silence < silence);
 }
 
+TEST(DecibelEquality, HoldsForOppositeInfinities)
+{
+    EXPECT_TRUE(Decibel::fromRelativeLevel(0.0) == dB(std::numeric_limits<double>::infinity()));
+}
+
 TEST(DecibelOrder, IsPlainWhenStrictAndFuzzyWhenNot)
 {
     const Decibel level = dB(1.0);

@@ -22,9 +22,9 @@ public:
     /// A pixel's width to its height.
     int aspectX = 1;
     int aspectY = 1;
-    /// Not stored.
+    /// Lives in memory only: a loaded record has the default.
     bool exportMode = false;
-    /// Not stored.
+    /// Lives in memory only: a loaded record has the default.
     bool opaque = true;
 
     Video() = default;

@@ -72,10 +72,11 @@ protected:
     virtual void fileFailed(const Media::File* file);
 
     /// Forgets all that was known of the file and marks it, with its new path, as opening. Whoever owns it is
-    /// to open it. Null, or no file, stands for the first one; a view needs one for this.
+    /// to open it. Null, or no file, stands for the first one. On an empty view it is a change(nullptr): a
+    /// temporary is added, whose address ends with the call.
     void fileOpen(const Media::File* file, const QString& path);
     void fileOpen(const QString& path);
-    /// Forgets all that was known of the file, its path included. As with fileOpen() a view needs one.
+    /// Forgets all that was known of the file, its path included. Null and no file are as in fileOpen().
     void fileClose(const Media::File* file);
     void fileClose();
 

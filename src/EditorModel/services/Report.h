@@ -20,6 +20,7 @@ public:
     Progress* setCancelButtonText(const QString& value);
     /// Sets or clears the wish to cancel; the work itself looks at it.
     Progress* cancel(bool value);
+    /// A hint for whoever shows the dialog, that it is the only modal one; the model gives it no meaning.
     Progress* setUniqueModal(bool value);
 
     int total = 0;
