@@ -52,11 +52,16 @@ int widthOf(const QVector<uint>& characters)
 
 bool steersATerminal(uint character)
 {
+    // The joiners shape letters and emoji; other format characters can turn a line round.
+    constexpr uint nonJoiner = 0x200C;
+    constexpr uint joiner = 0x200D;
     switch (QChar::category(character)) {
     case QChar::Other_Control:
     case QChar::Separator_Line:
     case QChar::Separator_Paragraph:
         return true;
+    case QChar::Other_Format:
+        return character != nonJoiner && character != joiner;
     default:
         return false;
     }

@@ -45,30 +45,6 @@ struct Options
     ~Options() { av_dict_free(&entries); }
 };
 
-void refuseWhatIsNoFile(const std::filesystem::path& path)
-{
-    namespace fs = std::filesystem;
-    std::error_code error;
-    const fs::file_status status = fs::status(path, error);
-    if (status.type() == fs::file_type::not_found) {
-        const bool isLink = fs::is_symlink(fs::symlink_status(path, error));
-        throw MediaError(isLink ? "is a link to a file that does not exist" : "does not exist");
-    }
-    if (error) {
-        throwUnreadable(error.value());
-    }
-    if (fs::is_directory(status)) {
-        throw MediaError("is a folder");
-    }
-    // Opening a pipe or a device could wait forever.
-    if (!fs::is_regular_file(status)) {
-        throw MediaError("is not a regular file");
-    }
-    if (fs::file_size(path, error) == 0) {
-        throw MediaError("is empty");
-    }
-}
-
 /// Without the protocol a name such as "concat:x" would be taken for an address.
 QByteArray urlOf(const QString& path)
 {
@@ -154,6 +130,37 @@ AVFormatContext* openContext(AVIOContext& file, const Recognition& recognition, 
 
 MediaError::MediaError(const QString& why) : std::runtime_error(why.toStdString()), reason(why) {}
 
+void requireFile(const QString& path)
+{
+    namespace fs = std::filesystem;
+    if (path.isEmpty()) {
+        throw MediaError("has no name");
+    }
+    const fs::path file(QFile::encodeName(path).toStdString());
+    std::error_code error;
+    const fs::file_status status = fs::status(file, error);
+    if (status.type() == fs::file_type::not_found) {
+        // Bytes that are no UTF-8 have become this character, and the name leads nowhere.
+        if (path.contains(QChar(QChar::ReplacementCharacter))) {
+            throw MediaError("does not exist, or its name is not UTF-8");
+        }
+        const bool isLink = fs::is_symlink(fs::symlink_status(file, error));
+        throw MediaError(isLink ? "is a link to a file that does not exist" : "does not exist");
+    }
+    if (error) {
+        throwUnreadable(error.value());
+    }
+    if (fs::is_directory(status)) {
+        throw MediaError("is a folder");
+    }
+    if (!fs::is_regular_file(status)) {
+        throw MediaError("is not a regular file");
+    }
+    if (fs::file_size(file, error) == 0) {
+        throw MediaError("is empty");
+    }
+}
+
 void MediaInput::CloseFile::operator()(AVIOContext* file) const
 {
     avio_closep(&file);
@@ -166,7 +173,7 @@ void MediaInput::CloseContext::operator()(AVFormatContext* context) const
 
 MediaInput::MediaInput(const QString& path)
 {
-    refuseWhatIsNoFile(QFile::encodeName(path).toStdString());
+    requireFile(path);
     m_file.reset(openFile(path));
     const Recognition recognition = recognise(*m_file, urlOf(path));
     m_context.reset(openContext(*m_file, recognition, path));

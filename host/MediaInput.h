@@ -24,6 +24,10 @@ public:
     const QString reason;
 };
 
+/// Throws MediaError for what is no regular file with something in it: opening a pipe or a device could wait
+/// forever.
+void requireFile(const QString& path);
+
 /// A media file opened with FFmpeg, with the formats of its streams known. Nothing is read over a network,
 /// also not where the file is a playlist.
 class MediaInput

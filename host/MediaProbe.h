@@ -44,8 +44,7 @@ using MediaResult = std::variant<MediaDescription, MediaFailure>;
 /// - `bitrate` is in bits per second, 0 where the file doesn't tell.
 /// - `channelLayout` is the number of channels, `sampleFormat` the number of FFmpeg's sample format.
 /// - `width`, `height` and the pixel aspect are those of the picture as it is shown: where the file asks for
-/// a
-///   quarter turn they are exchanged.
+///   a quarter turn they are exchanged.
 /// - Still pictures and cover art have `isImage` set, and the frame rate 0/1.
 /// - `opaque` is false where the pixels have an alpha channel.
 ///

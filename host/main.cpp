@@ -13,6 +13,8 @@
 
 #include <clocale>
 #include <cstdlib>
+#include <exception>
+#include <new>
 #include <string>
 #include <vector>
 
@@ -90,5 +92,12 @@ int main(int argc, char** argv)
     } catch (const CLI::ParseError& error) {
         return app.exit(error) == 0 ? Host::Success : Host::UsageError;
     }
-    return probe->parsed() ? runProbe(arguments) : Host::show(fileName(arguments.document));
+    try {
+        return probe->parsed() ? runProbe(arguments) : Host::show(fileName(arguments.document));
+    } catch (const std::bad_alloc&) {
+        Host::writeError(QStringLiteral("there is not enough memory"));
+    } catch (const std::exception& error) {
+        Host::writeError(QString::fromUtf8(error.what()));
+    }
+    return Host::Failure;
 }

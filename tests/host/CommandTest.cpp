@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Samples.h"
 
+#include <EditorModel/media/File.h>
+#include <EditorModel/persistence/Document.h>
+
 #include <QProcess>
 #include <QProcessEnvironment>
 #include <QStringList>
@@ -250,6 +253,37 @@ TEST(ShowCommand, TellsInOneLineThatAFileIsNoDocument)
         EXPECT_THAT(shown.errors, HasSubstr(name));
         EXPECT_EQ(std::count(shown.errors.begin(), shown.errors.end(), '\n'), 1) << shown.errors;
     }
+}
+
+TEST(ShowCommand, TakesRegularFilesOnly)
+{
+    EXPECT_EQ(editormodel({"show", "/dev/zero"}).exitCode, 1);
+    EXPECT_EQ(editormodel({"show", "/dev/zero"}).errors, "/dev/zero: is not a regular file\n");
+    EXPECT_EQ(editormodel({"show", "/"}).errors, "/: is a folder\n");
+}
+
+/// Boost's readers do not withstand malice, and --save does not write for them.
+TEST(ShowCommand, TakesNoArchiveThatOneMustTrust)
+{
+    const Folder folder;
+    const Media::File file;
+    for (const auto form : {Document::Binary, Document::Xml}) {
+        const QString path = folder.path() + "/archive";
+        Document::saveFile(path, {&file}, form, Document::Archive);
+        const Outcome shown = editormodel({"show", path});
+        EXPECT_EQ(shown.exitCode, 1);
+        EXPECT_THAT(shown.errors, HasSubstr("an archive of this form is taken from oneself alone"));
+    }
+}
+
+TEST(ProbeCommand, TellsWhichNamesItCannotTake)
+{
+    EXPECT_THAT(editormodel({"probe", ""}).errors, HasSubstr("has no name"));
+    EXPECT_EQ(editormodel({"probe", ""}).exitCode, 1);
+    const Outcome latin1 =
+        run("/bin/sh", {"-c", "exec \"$0\" probe \"$(printf 'caf\\351.wav')\"", EDITORMODEL_COMMAND});
+    EXPECT_EQ(latin1.exitCode, 1);
+    EXPECT_THAT(latin1.errors, HasSubstr("its name is not UTF-8"));
 }
 
 TEST(ProbeCommand, TellsWhereADocumentCannotBeWritten)

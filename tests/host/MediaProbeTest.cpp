@@ -289,7 +289,7 @@ TEST_F(MediaProbe, NamesTheCodecsOfTracksThatItLeavesOut)
 TEST_F(MediaProbe, TellsWhyThereIsNothingToOpen)
 {
     EXPECT_EQ(reason(folder.path("missing.mp4")), "does not exist");
-    EXPECT_EQ(reason(QString()), "does not exist");
+    EXPECT_EQ(reason(QString()), "has no name");
     EXPECT_EQ(reason(folder.path()), "is a folder");
     EXPECT_EQ(reason(folder.write("empty.mp4", QByteArray())), "is empty");
     EXPECT_EQ(reason("/dev/null"), "is not a regular file");

@@ -26,6 +26,9 @@ TEST(DisplayText, WritesOutWhatWouldSteerTheTerminal)
     EXPECT_EQ(Host::printable(QString::fromUtf8("写真 \"ä\"")), "写真 \"ä\"");
     EXPECT_EQ(Host::printable("a\nb\x1b[2Jc"), "a\\x0ab\\x1b[2Jc");
     EXPECT_EQ(Host::printable(QString(QChar(0x2028))), "\\x2028");
+    // What turns a line round, and what joins the parts of an emoji.
+    EXPECT_EQ(Host::printable(QString(QChar(0x202E))), "\\x202e");
+    EXPECT_EQ(Host::printable(QString(QChar(0x200D))), "\xE2\x80\x8D");
 }
 
 TEST(DisplayText, CutsLongTextsToTheWidth)
