@@ -8,6 +8,15 @@
 #include <cstdio>
 
 namespace Host {
+namespace {
+
+/// Not with fmt::print(), which throws where the error output cannot be written: nobody could be told.
+void put(const std::string& line)
+{
+    std::fputs((line + '\n').c_str(), stderr);
+}
+
+} // namespace
 
 bool writeOutput(const std::string& text)
 {
@@ -21,12 +30,12 @@ bool writeOutput(const std::string& text)
 
 void writeError(const QString& message)
 {
-    fmt::print(stderr, "{}\n", printable(message.simplified()));
+    put(printable(message.simplified()));
 }
 
 void writeError(const QString& name, const QString& message)
 {
-    fmt::print(stderr, "{}: {}\n", printable(name), printable(message.simplified()));
+    put(fmt::format("{}: {}", name.isEmpty() ? "\"\"" : printable(name), printable(message.simplified())));
 }
 
 } // namespace Host

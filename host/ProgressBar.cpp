@@ -54,7 +54,7 @@ void ProgressBar::changed(const Report::Progress* progress)
     }
     wipe();
     // The last column stays free: some terminals go on to the next line when it is filled.
-    fmt::print(m_stream, "{}", progressLine(*progress, columnsOf(m_stream) - 1));
+    std::fputs(progressLine(*progress, columnsOf(m_stream) - 1).c_str(), m_stream);
     std::fflush(m_stream);
     m_isDrawn = true;
 }
@@ -67,7 +67,7 @@ void ProgressBar::removed(const Report::Progress*)
 void ProgressBar::wipe()
 {
     if (m_isDrawn) {
-        fmt::print(m_stream, "\r\x1b[K");
+        std::fputs("\r\x1b[K", m_stream);
         std::fflush(m_stream);
         m_isDrawn = false;
     }

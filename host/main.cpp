@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Console.h"
+#include "DisplayText.h"
 #include "MediaProbe.h"
 #include "ProbeCommand.h"
 #include "ShowCommand.h"
@@ -42,6 +43,21 @@ std::string checkDocumentName(const std::string& name)
                                                 : "the name of a document ends in .json, .xml or .bin";
 }
 
+/// The arguments in it must not steer the terminal.
+std::string usageMessage(const CLI::App*, const CLI::Error& error)
+{
+    return Host::printable(QString::fromStdString(error.what()).simplified()) +
+           "\nRun with --help for more information; a file name that begins with - goes after --.\n";
+}
+
+/// An unknown option is the better reason than the file that is missing then.
+int refuse(const CLI::App& app, const CLI::ParseError& error)
+{
+    const std::vector<std::string> unknown = app.remaining(true);
+    const bool isMissing = dynamic_cast<const CLI::RequiredError*>(&error) != nullptr;
+    return isMissing && !unknown.empty() ? app.exit(CLI::ExtrasError(unknown)) : app.exit(error);
+}
+
 struct Arguments
 {
     std::vector<std::string> files;
@@ -72,6 +88,7 @@ int main(int argc, char** argv)
     Arguments arguments;
     CLI::App app("Describes media files, and shows descriptions that were saved.", "editormodel");
     app.require_subcommand(1);
+    app.failure_message(usageMessage);
 
     CLI::App* const probe = app.add_subcommand("probe", "Describe media files");
     probe->add_option("FILE", arguments.files, "Video, sound or picture files")->required()->type_name("");
@@ -90,7 +107,7 @@ int main(int argc, char** argv)
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
-        return app.exit(error) == 0 ? Host::Success : Host::UsageError;
+        return refuse(app, error) == 0 ? Host::Success : Host::UsageError;
     }
     try {
         return probe->parsed() ? runProbe(arguments) : Host::show(fileName(arguments.document));

@@ -276,9 +276,25 @@ TEST(ShowCommand, TakesNoArchiveThatOneMustTrust)
     }
 }
 
+TEST(Command, EndsByItselfWhereItCanTellNobody)
+{
+    EXPECT_EQ(run("/bin/sh", {"-c", "exec \"$0\" probe missing 2>/dev/full", EDITORMODEL_COMMAND}).exitCode,
+              1);
+    EXPECT_EQ(run("/bin/sh", {"-c", "exec \"$0\" probe missing 2>&-", EDITORMODEL_COMMAND}).exitCode, 1);
+}
+
+TEST(Command, NamesTheOptionThatItDoesNotKnow)
+{
+    const Outcome outcome = editormodel({"probe", "-dash\x1b[2J.mp4"});
+    EXPECT_EQ(outcome.exitCode, 2);
+    EXPECT_THAT(outcome.errors, HasSubstr("-dash\\x1b[2J.mp4"));
+    EXPECT_THAT(outcome.errors, HasSubstr("goes after --"));
+    EXPECT_THAT(editormodel({"probe", "--", "-dash.mp4"}).errors, StartsWith("-dash.mp4: does not exist"));
+}
+
 TEST(ProbeCommand, TellsWhichNamesItCannotTake)
 {
-    EXPECT_THAT(editormodel({"probe", ""}).errors, HasSubstr("has no name"));
+    EXPECT_THAT(editormodel({"probe", ""}).errors, HasSubstr("\"\": has no name"));
     EXPECT_EQ(editormodel({"probe", ""}).exitCode, 1);
     const Outcome latin1 =
         run("/bin/sh", {"-c", "exec \"$0\" probe \"$(printf 'caf\\351.wav')\"", EDITORMODEL_COMMAND});
