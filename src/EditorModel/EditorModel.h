@@ -16,6 +16,8 @@
 #include <EditorModel/media/FileTarget.h>
 #include <EditorModel/media/Media.h>
 #include <EditorModel/media/Object.h>
+#include <EditorModel/media/Resource.h>
+#include <EditorModel/media/ResourceRef.h>
 #include <EditorModel/media/Video.h>
 #include <EditorModel/media/Views.h>
 #include <EditorModel/persistence/Document.h>
