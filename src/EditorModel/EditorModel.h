@@ -10,6 +10,9 @@
 #include <EditorModel/bus/PubSub.h>
 #include <EditorModel/bus/TypedView.h>
 #include <EditorModel/bus/View.h>
+#include <EditorModel/effects/Animation.h>
+#include <EditorModel/effects/Envelope.h>
+#include <EditorModel/effects/Transformation.h>
 #include <EditorModel/library/EditorCollection.h>
 #include <EditorModel/media/Audio.h>
 #include <EditorModel/media/File.h>

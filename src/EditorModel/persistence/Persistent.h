@@ -113,3 +113,22 @@ public:
     }                                                                                                        \
     }                                                                                                        \
     }
+
+/// In the header, behind a class template that carries `EDITORMODEL_PERSISTENT` and the archive name of one
+/// of its instantiations: declares what `EDITORMODEL_PERSISTENT_INSTANTIATION_CLASS` defines in a source, its
+/// registrator included. An `extern template class` follows. `Class` has no comma in it: give an alias.
+#define EDITORMODEL_PERSISTENT_INSTANTIATION(Class)                                                          \
+    template <>                                                                                              \
+    const char* Class::NameInArchive();                                                                      \
+    template <>                                                                                              \
+    const std::string Class::GetNameInArchive() const;                                                       \
+    template <>                                                                                              \
+    void Class::Serialize(::Serialize::ISerializer& serializer) const;                                       \
+    template <>                                                                                              \
+    void Class::Deserialize(::Serialize::IDeserializer& deserializer);                                       \
+    template <>                                                                                              \
+    const ::Serialize::Type& Class::persistentType();                                                        \
+    template <>                                                                                              \
+    ::Serialize::ISerializable* Class::Creator::Create() const;                                              \
+    template <>                                                                                              \
+    const ::Serialize::Registrator Class::s_registrator;

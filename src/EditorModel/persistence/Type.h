@@ -137,28 +137,34 @@ EDITORMODEL_EXPORT void readFields(IDeserializer& deserializer, const Type& type
 
 /// In the source of a class that carries `EDITORMODEL_PERSISTENT_UNREGISTERED`, at global scope, behind its
 /// `void fields(Serialize::Fields& f, Class& object)`.
-#define EDITORMODEL_PERSISTENT_CLASS_UNREGISTERED(Class, Name) EDITORMODEL_DETAILS_TYPE_(Class, Name, false)
+#define EDITORMODEL_PERSISTENT_CLASS_UNREGISTERED(Class, Name) EDITORMODEL_DETAILS_TYPE_(, Class, Name, false)
 
 /// In the source of a class that carries `EDITORMODEL_PERSISTENT`, at global scope, behind its
 /// `void fields(Serialize::Fields& f, Class& object)`. Persistent bases follow the class.
-#define EDITORMODEL_PERSISTENT_CLASS(...) EDITORMODEL_DETAILS_CLASS_(__VA_ARGS__, ::Serialize::ISerializable)
+#define EDITORMODEL_PERSISTENT_CLASS(...)                                                                    \
+    EDITORMODEL_DETAILS_CLASS_(, __VA_ARGS__, ::Serialize::ISerializable)
 
-#define EDITORMODEL_DETAILS_CLASS_(Class, ...)                                                               \
-    EDITORMODEL_DETAILS_TYPE_(Class, ::boost::serialization::guid<Class>(), true)                            \
-    ::Serialize::ISerializable* Class::Creator::Create() const                                               \
+/// The same for an instantiation that `EDITORMODEL_PERSISTENT_INSTANTIATION` declares in the header, before
+/// the `template class` that makes it.
+#define EDITORMODEL_PERSISTENT_INSTANTIATION_CLASS(...)                                                      \
+    EDITORMODEL_DETAILS_CLASS_(template <>, __VA_ARGS__, ::Serialize::ISerializable)
+
+#define EDITORMODEL_DETAILS_CLASS_(Template, Class, ...)                                                     \
+    EDITORMODEL_DETAILS_TYPE_(Template, Class, ::boost::serialization::guid<Class>(), true)                  \
+    Template ::Serialize::ISerializable* Class::Creator::Create() const                                      \
     {                                                                                                        \
         return new Class;                                                                                    \
     }                                                                                                        \
-    const ::Serialize::Registrator Class::s_registrator(::Serialize::Details::enter<Class, __VA_ARGS__>(),   \
-                                                        new Class::Creator);
+    Template const ::Serialize::Registrator Class::s_registrator(                                            \
+        ::Serialize::Details::enter<Class, __VA_ARGS__>(), new Class::Creator);
 
-#define EDITORMODEL_DETAILS_TYPE_(Class, Name, Exported)                                                     \
+#define EDITORMODEL_DETAILS_TYPE_(Template, Class, Name, Exported)                                           \
     template <>                                                                                              \
     void Serialize::Details::visitFields<Class>(::Serialize::Fields & f, Class & object)                     \
     {                                                                                                        \
         fields(f, object);                                                                                   \
     }                                                                                                        \
-    const ::Serialize::Type& Class::persistentType()                                                         \
+    Template const ::Serialize::Type& Class::persistentType()                                                \
     {                                                                                                        \
         static const ::Serialize::Type type{typeid(Class),                                                   \
                                             &::Serialize::Details::visitType<Class>,                         \
@@ -171,19 +177,19 @@ EDITORMODEL_EXPORT void readFields(IDeserializer& deserializer, const Type& type
                                             &::Serialize::Details::serializableOf<Class>};                   \
         return type;                                                                                         \
     }                                                                                                        \
-    const char* Class::NameInArchive()                                                                       \
+    Template const char* Class::NameInArchive()                                                              \
     {                                                                                                        \
         return Name;                                                                                         \
     }                                                                                                        \
-    const std::string Class::GetNameInArchive() const                                                        \
+    Template const std::string Class::GetNameInArchive() const                                               \
     {                                                                                                        \
         return Name;                                                                                         \
     }                                                                                                        \
-    void Class::Serialize(::Serialize::ISerializer& serializer) const                                        \
+    Template void Class::Serialize(::Serialize::ISerializer& serializer) const                               \
     {                                                                                                        \
         ::Serialize::Details::writeFields(serializer, persistentType(), this);                               \
     }                                                                                                        \
-    void Class::Deserialize(::Serialize::IDeserializer& deserializer)                                        \
+    Template void Class::Deserialize(::Serialize::IDeserializer& deserializer)                               \
     {                                                                                                        \
         ::Serialize::Details::readFields(deserializer, persistentType(), this);                              \
     }
