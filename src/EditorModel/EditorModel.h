@@ -16,11 +16,15 @@
 #include <EditorModel/library/EditorCollection.h>
 #include <EditorModel/media/Audio.h>
 #include <EditorModel/media/File.h>
+#include <EditorModel/media/FileAnalyzer.h>
 #include <EditorModel/media/FileTarget.h>
 #include <EditorModel/media/Media.h>
 #include <EditorModel/media/Object.h>
 #include <EditorModel/media/Resource.h>
+#include <EditorModel/media/ResourceHooks.h>
+#include <EditorModel/media/ResourceInfo.h>
 #include <EditorModel/media/ResourceRef.h>
+#include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/media/Video.h>
 #include <EditorModel/media/Views.h>
 #include <EditorModel/persistence/Document.h>

@@ -15,7 +15,7 @@
 #include <string>
 
 namespace Composition {
-class Object;
+struct Object;
 }
 
 namespace Media {
