@@ -18,13 +18,13 @@ void MessageTable::unregisterSubscriber(const void* subscriber) noexcept
 
 void MessageTable::subscribe(const Recipient& recipient, const Object* object)
 {
-    m_bySender.add(object).add(recipient);
+    m_state.bySender.add(object).add(recipient);
 }
 
 void MessageTable::unsubscribe(const Recipient& recipient, const Object* object) noexcept
 {
     ++m_state.removals;
-    m_bySender.removeIf(object, [&](RecipientList& recipients) {
+    m_state.bySender.removeIf(object, [&](RecipientList& recipients) {
         recipients.remove(recipient.subscriber);
         return recipients.isEmpty();
     });
@@ -62,21 +62,7 @@ RecipientList* MessageTable::findAll(const std::type_index& objectType) const no
     return nullptr;
 }
 
-/// The way to a single recipient or to none calls nothing.
-Snapshot MessageTable::snapshot(const Object* sender, const RecipientList& all)
-{
-    const RecipientList* some = m_bySender.find(sender);
-    if (some && !all.isEmpty()) {
-        return snapshotOfBoth(sender, *some, all);
-    }
-    const RecipientList& recipients = some ? *some : all;
-    if (recipients.isLong()) {
-        return snapshotOfOne(recipients);
-    }
-    return {recipients.first().subscriber, recipients.isEmpty() ? 0u : 1u};
-}
-
-Snapshot MessageTable::snapshotOfOne(const RecipientList& recipients)
+Snapshot MessageTable::snapshotOfMany(const RecipientList& recipients)
 {
     push(recipients);
     return {recipients.first().subscriber, recipients.size()};
@@ -122,6 +108,25 @@ bool MessageTable::isDue(const Recipient& recipient, const Object* sender,
     const Registration* registration = m_registrations.find(recipient.subscriber);
     return registration && registration->serial == recipient.registration &&
            (registration->base->isSubscribed(objectType) || registration->base->isSubscribed(sender));
+}
+
+Channel::Channel(MessageTable& table, RecipientList& all, const std::type_index& objectType)
+    : m_table(&table), m_all(&all), m_state(&table.state()), m_objectType(objectType)
+{}
+
+Snapshot Channel::snapshotOfMany(const RecipientList& recipients) const
+{
+    return m_table->snapshotOfMany(recipients);
+}
+
+Snapshot Channel::snapshotOfBoth(const Object* sender, const RecipientList& some) const
+{
+    return m_table->snapshotOfBoth(sender, some, *m_all);
+}
+
+bool Channel::isDue(const Recipient& recipient, const Object* sender) const
+{
+    return m_table->isDue(recipient, sender, m_objectType);
 }
 
 } // namespace PubSub::Details

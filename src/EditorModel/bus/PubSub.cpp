@@ -256,19 +256,5 @@ std::deque<void*> Dispatcher::getSubscribers(const MessageBase&, const std::type
     return subscribers;
 }
 
-Channel::Channel(MessageTable& table, RecipientList& all, const std::type_index& objectType)
-    : m_table(&table), m_all(&all), m_state(&table.state()), m_objectType(objectType)
-{}
-
-Snapshot Channel::snapshot(const Object* sender) const
-{
-    return m_table->snapshot(sender, *m_all);
-}
-
-bool Channel::isDue(const Recipient& recipient, const Object* sender) const
-{
-    return m_table->isDue(recipient, sender, m_objectType);
-}
-
 } // namespace Details
 } // namespace PubSub

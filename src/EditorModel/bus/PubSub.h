@@ -2,6 +2,7 @@
 #pragma once
 
 #include <EditorModel/Export.h>
+#include <EditorModel/bus/detail/RecipientList.h>
 
 #include <QtGlobal>
 
@@ -32,7 +33,6 @@ namespace Details {
 
 class DispatcherProbe;
 class MessageTable;
-class RecipientList;
 
 /// Polymorphic root of all messages.
 class EDITORMODEL_EXPORT MessageBase
@@ -138,17 +138,10 @@ public:
     ~Subscriber() override { unregisterSelf(this, this, typeid(M)); }
 };
 
-/// One entry of a snapshot: a Details::Subscriber<M>* and the serial number of its registration. Serial
-/// numbers are never used twice, so a subscriber that was built where another one ended is not taken for it.
-struct Recipient
-{
-    void* subscriber;
-    quint64 registration;
-};
-
-/// The part of a message type's table that a running publication reads between two deliveries.
+/// The part of a message type's table that a publication reads without a call.
 struct DeliveryState
 {
+    PointerMap<RecipientList> bySender;
     /// The snapshots of all running publications, innermost last. They move when the arena grows.
     Recipient* snapshots = nullptr;
     std::size_t used = 0;
@@ -168,8 +161,22 @@ struct Snapshot
 class EDITORMODEL_EXPORT Channel
 {
 public:
-    /// The innermost snapshot lies in the arena if it counts more than one.
-    Snapshot snapshot(const Object* sender) const;
+    /// The innermost snapshot lies in the arena if it counts more than one. The way to a single recipient, or
+    /// to none, calls nothing.
+    Q_ALWAYS_INLINE Snapshot snapshot(const Object* sender) const
+    {
+        const RecipientList* recipients = m_state->bySender.find(sender);
+        if (!recipients) {
+            recipients = m_all;
+        } else if (!m_all->isEmpty()) {
+            return snapshotOfBoth(sender, *recipients);
+        }
+        if (recipients->isLong()) {
+            return snapshotOfMany(*recipients);
+        }
+        return {recipients->first().subscriber, recipients->isEmpty() ? 0u : 1u};
+    }
+
     /// Whether somebody in a snapshot still lives and is subscribed, to the sender or to all.
     bool isDue(const Recipient& recipient, const Object* sender) const;
     DeliveryState& state() const { return *m_state; }
@@ -177,6 +184,8 @@ public:
 private:
     friend class Dispatcher;
     Channel(MessageTable& table, RecipientList& all, const std::type_index& objectType);
+    Snapshot snapshotOfMany(const RecipientList& recipients) const;
+    Snapshot snapshotOfBoth(const Object* sender, const RecipientList& some) const;
 
     MessageTable* m_table;
     RecipientList* m_all;
@@ -257,6 +266,20 @@ const Object* senderAddress(const T* sender)
     }
 }
 
+/// Delivers to more than one. Apart, so that the way to a single one stays short.
+template <typename M>
+Q_NEVER_INLINE void deliver(const M& message, const Object* sender, const Channel& channel,
+                            const Snapshot& snapshot)
+{
+    const SnapshotScope recipients(channel, snapshot);
+    for (std::size_t i = 0; i != snapshot.count; ++i) {
+        const Recipient& recipient = recipients[i];
+        if (recipients.isUntouched() || channel.isDue(recipient, sender)) {
+            static_cast<Subscriber<M>*>(recipient.subscriber)->notify(message);
+        }
+    }
+}
+
 } // namespace Details
 
 /// Receives the messages of several types with one set of subscriptions.
@@ -296,13 +319,7 @@ void publish(const M& message)
         static_cast<Details::Subscriber<M>*>(snapshot.first)->notify(message);
         return;
     }
-    const Details::SnapshotScope recipients(channel, snapshot);
-    for (std::size_t i = 0; i != snapshot.count; ++i) {
-        const Details::Recipient& recipient = recipients[i];
-        if (recipients.isUntouched() || channel.isDue(recipient, sender)) {
-            static_cast<Details::Subscriber<M>*>(recipient.subscriber)->notify(message);
-        }
-    }
+    Details::deliver(message, sender, channel, snapshot);
 }
 
 } // namespace PubSub

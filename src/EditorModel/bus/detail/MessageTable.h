@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <EditorModel/bus/detail/RecipientList.h>
+#include <EditorModel/bus/PubSub.h>
 
 #include <utility>
 #include <vector>
@@ -27,7 +27,9 @@ public:
     /// The recipients that subscribed to all objects of the type. Stays in place.
     RecipientList& all(const std::type_index& objectType);
 
-    Snapshot snapshot(const Object* sender, const RecipientList& all);
+    /// Of several recipients. Nobody is in it twice.
+    Snapshot snapshotOfMany(const RecipientList& recipients);
+    Snapshot snapshotOfBoth(const Object* sender, const RecipientList& some, const RecipientList& all);
     bool isDue(const Recipient& recipient, const Object* sender, const std::type_index& objectType) const;
 
 private:
@@ -38,13 +40,10 @@ private:
     };
 
     RecipientList* findAll(const std::type_index& objectType) const noexcept;
-    Snapshot snapshotOfOne(const RecipientList& recipients);
-    Snapshot snapshotOfBoth(const Object* sender, const RecipientList& some, const RecipientList& all);
     void push(const RecipientList& recipients);
     void reserve(std::size_t count);
 
     DeliveryState m_state;
-    PointerMap<RecipientList> m_bySender;
     std::vector<std::pair<std::type_index, std::unique_ptr<RecipientList>>> m_byType;
     PointerMap<Registration> m_registrations;
     quint64 m_lastSerial = 0;

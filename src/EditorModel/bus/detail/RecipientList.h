@@ -1,13 +1,24 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <EditorModel/bus/PubSub.h>
 #include <EditorModel/bus/detail/PointerMap.h>
 
+#include <QtGlobal>
+
 #include <algorithm>
+#include <cstddef>
+#include <memory>
 #include <vector>
 
 namespace PubSub::Details {
+
+/// One entry of a snapshot: a Details::Subscriber<M>* and the serial number of its registration. Serial
+/// numbers are never used twice, so a subscriber that was built where another one ended is not taken for it.
+struct Recipient
+{
+    void* subscriber;
+    quint64 registration;
+};
 
 /// The recipients of one object, or of all objects of a type, in no order. Most objects have one, which lies
 /// in the list itself. A long list keeps the positions of its members, so that leaving it doesn't search it.
