@@ -14,6 +14,7 @@
 #include <limits>
 #include <map>
 #include <stdexcept>
+#include <utility>
 
 namespace Serialize::Details {
 namespace {
@@ -31,7 +32,24 @@ template <class Archive>
 class ArchiveReader final : public ArchiveFields<Archive>
 {
 public:
-    explicit ArchiveReader(Archive& archive) : ArchiveFields<Archive>(true, archive) {}
+    explicit ArchiveReader(Archive& archive)
+        : ArchiveFields<Archive>(true, archive), m_outer(std::exchange(running, this))
+    {}
+    ArchiveReader(const ArchiveReader&) = delete;
+    ArchiveReader& operator=(const ArchiveReader&) = delete;
+    ~ArchiveReader() { running = m_outer; }
+
+    /// Reads the fields of an object that the archive holds, with the reader that is at work on the archive
+    /// if there is one.
+    static void read(Archive& archive, const Type& type, void* object)
+    {
+        if (running && &running->m_archive == &archive) {
+            visit(*running, type, object);
+        } else {
+            ArchiveReader reader(archive);
+            visit(reader, type, object);
+        }
+    }
 
 private:
     using ArchiveFields<Archive>::m_archive;
@@ -67,11 +85,10 @@ private:
     /// text.
     void load(const Key& key, QString& text)
     {
-        thread_local std::string utf8;
-        transfer(key.archive, utf8);
-        text = textOfUtf8(utf8);
-        if (utf8.size() > keptBuffer)
-            std::string().swap(utf8);
+        transfer(key.archive, m_utf8);
+        text = textOfUtf8(m_utf8);
+        if (m_utf8.size() > keptBuffer)
+            std::string().swap(m_utf8);
     }
 
     void load(const Key& key, MTime& time)
@@ -100,8 +117,10 @@ private:
             const ba::detail::basic_pointer_iserializer* declared = nullptr;
             if (field.declared) {
                 const auto& forms = formsOf(*field.declared).template of<Archive>();
-                archive.register_basic_serializer(forms.object);
                 declared = forms.pointer.get();
+                // To be done before each pointer, and without effect if it has been done.
+                if (std::exchange(m_registered, declared) != declared)
+                    archive.register_basic_serializer(forms.object);
             }
             void* object = nullptr;
             const auto* const found = archive.load_pointer(object, declared, &find);
@@ -168,7 +187,17 @@ private:
         }
         return owner;
     }
+
+    /// The reader at work on this thread, the innermost if several are.
+    static thread_local ArchiveReader* running;
+
+    ArchiveReader* const m_outer;
+    std::string m_utf8;
+    const ba::detail::basic_pointer_iserializer* m_registered = nullptr;
 };
+
+template <class Archive>
+thread_local ArchiveReader<Archive>* ArchiveReader<Archive>::running = nullptr;
 
 template <class Archive>
 void readRoots(std::istream& stream, Roots& roots)
@@ -192,14 +221,12 @@ void readXmlArchive(std::istream& stream, Roots& roots)
 
 void archiveFields(ba::binary_iarchive& archive, const Type& type, void* object)
 {
-    ArchiveReader<ba::binary_iarchive> fields(archive);
-    visit(fields, type, object);
+    ArchiveReader<ba::binary_iarchive>::read(archive, type, object);
 }
 
 void archiveFields(ba::xml_iarchive& archive, const Type& type, void* object)
 {
-    ArchiveReader<ba::xml_iarchive> fields(archive);
-    visit(fields, type, object);
+    ArchiveReader<ba::xml_iarchive>::read(archive, type, object);
 }
 
 } // namespace Serialize::Details
