@@ -12,7 +12,9 @@
 #include <EditorModel/bus/View.h>
 #include <EditorModel/effects/Animation.h>
 #include <EditorModel/effects/Envelope.h>
+#include <EditorModel/effects/PanAndZoom.h>
 #include <EditorModel/effects/Transformation.h>
+#include <EditorModel/effects/TransformationPreset.h>
 #include <EditorModel/library/EditorCollection.h>
 #include <EditorModel/media/Audio.h>
 #include <EditorModel/media/File.h>

@@ -1,0 +1,109 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "tests/shared/FieldVisitors.h"
+
+#include <EditorModel/effects/TransformationPreset.h>
+
+#include <gtest/gtest.h>
+
+#include <memory>
+#include <type_traits>
+#include <utility>
+
+namespace {
+
+using Envelope::TransformationPreset;
+
+static_assert(std::is_base_of_v<Serialize::ISerializable, TransformationPreset>);
+static_assert(std::is_base_of_v<PubSub::Object, TransformationPreset>);
+
+TransformationPreset presetWithEveryFieldSet()
+{
+    TransformationPreset preset;
+    preset.type = TransformationPreset::Type(3);
+    preset.tag = "slow";
+    preset.description = "From left to right";
+    preset.sourceDuration = MTime(2500);
+    preset.transformation.addKeyValue(0.5, Transformation::Object(Types::Transform(), 70));
+    preset.transformation.defaultValue.setOpacity(20);
+    return preset;
+}
+
+void expectEveryFieldSet(const TransformationPreset& preset)
+{
+    EXPECT_EQ(preset.type, 3);
+    EXPECT_EQ(preset.tag, "slow");
+    EXPECT_EQ(preset.description, "From left to right");
+    EXPECT_EQ(preset.sourceDuration, MTime(2500));
+    ASSERT_EQ(preset.transformation.keyValues.size(), 1u);
+    EXPECT_EQ(preset.transformation.keyValues.front().step, 0.5);
+    EXPECT_EQ(preset.transformation.keyValues.front().value.opacity, 70);
+    EXPECT_EQ(preset.transformation.defaultValue.opacity, 20);
+}
+
+TEST(TransformationPreset, IsEmptyByDefault)
+{
+    const TransformationPreset preset;
+    EXPECT_EQ(preset.type, 0);
+    EXPECT_TRUE(preset.tag.isEmpty());
+    EXPECT_TRUE(preset.description.isEmpty());
+    EXPECT_EQ(preset.sourceDuration, MTime());
+    EXPECT_TRUE(preset.transformation.keyValues.empty());
+    EXPECT_EQ(preset.transformation.defaultValue, Transformation::Object());
+}
+
+TEST(TransformationPreset, CopiesWhole)
+{
+    const TransformationPreset original = presetWithEveryFieldSet();
+    TransformationPreset copy(original);
+    expectEveryFieldSet(copy);
+
+    TransformationPreset assigned;
+    EXPECT_EQ(&(assigned = original), &assigned);
+    expectEveryFieldSet(assigned);
+    const TransformationPreset& itself = assigned;
+    assigned = itself;
+    expectEveryFieldSet(assigned);
+
+    TransformationPreset moved(std::move(copy));
+    expectEveryFieldSet(moved);
+    TransformationPreset target;
+    EXPECT_EQ(&(target = std::move(moved)), &target);
+    expectEveryFieldSet(target);
+    expectEveryFieldSet(original);
+}
+
+TEST(TransformationPreset, LeavesNoKeysBehindWhenItIsMoved)
+{
+    TransformationPreset original = presetWithEveryFieldSet();
+    const TransformationPreset moved(std::move(original));
+    EXPECT_TRUE(original.transformation.keyValues.empty());
+    EXPECT_EQ(original.transformation.defaultValue.opacity, 20);
+}
+
+TEST(TransformationPreset, HasAMimeType)
+{
+    ASSERT_NE(TransformationPreset::mimeType, nullptr);
+    EXPECT_EQ(*TransformationPreset::mimeType, "x-application/TransformationItem-serialized");
+}
+
+TEST(TransformationPreset, IsStoredUnderItsNameFieldByField)
+{
+    EXPECT_STREQ(TransformationPreset::NameInArchive(), "Envelope::TransformationPreset");
+    EXPECT_EQ(TransformationPreset().GetNameInArchive(), "Envelope::TransformationPreset");
+    ASSERT_NE(Serialize::findCreator("Envelope::TransformationPreset"), nullptr);
+    const std::unique_ptr<Serialize::ISerializable> made(
+        Serialize::findCreator("Envelope::TransformationPreset")->Create());
+    EXPECT_NE(dynamic_cast<TransformationPreset*>(made.get()), nullptr);
+
+    const std::string dump = Testing::Dump::of(presetWithEveryFieldSet());
+    const std::string expected = "root: Envelope::TransformationPreset #1\n"
+                                 "  type: 3\n"
+                                 "  tag: Q\"slow\"\n"
+                                 "  description: Q\"From left to right\"\n"
+                                 "  sourceDuration: 2500ms\n"
+                                 "  transformation: TransformationEnvelope\n"
+                                 "    defaultValue: Transformation::Object\n";
+    EXPECT_EQ(dump.substr(0, expected.size()), expected);
+}
+
+} // namespace
