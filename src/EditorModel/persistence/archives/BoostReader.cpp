@@ -37,7 +37,7 @@ public:
     {}
     ArchiveReader(const ArchiveReader&) = delete;
     ArchiveReader& operator=(const ArchiveReader&) = delete;
-    ~ArchiveReader() { running = m_outer; }
+    ~ArchiveReader() override { running = m_outer; }
 
     /// Reads the fields of an object that the archive holds, with the reader that is at work on the archive
     /// if there is one.
