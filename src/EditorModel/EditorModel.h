@@ -5,6 +5,10 @@
 // the headers of the archives' libraries along.
 
 #include <EditorModel/Export.h>
+#include <EditorModel/analysis/BeatDetection.h>
+#include <EditorModel/analysis/ClipSynchronization.h>
+#include <EditorModel/analysis/SceneDetection.h>
+#include <EditorModel/analysis/Stabilization.h>
 #include <EditorModel/bus/Messages.h>
 #include <EditorModel/bus/Preview.h>
 #include <EditorModel/bus/PubSub.h>
