@@ -91,6 +91,9 @@ class EDITORMODEL_EXPORT Fields
 public:
     /// True if the visitor stores into the fields.
     bool loading() const { return m_loading; }
+    /// True if a map that is read into keeps the entries that it has. The field stream adds to maps, and the
+    /// archives replace them, as their libraries do.
+    bool keepsEntries() const { return m_keepsEntries; }
 
     /// A field. Pointers are nullable and read strictly: an object of another class throws `std::bad_cast`.
     template <class T>
@@ -146,7 +149,9 @@ public:
     std::shared_ptr<const Types::Image> share(const Types::Image* image);
 
 protected:
-    explicit Fields(bool loading) : m_loading(loading) {}
+    explicit Fields(bool loading, bool keepsEntries = false)
+        : m_loading(loading), m_keepsEntries(keepsEntries)
+    {}
     virtual ~Fields();
     Fields(const Fields&) = delete;
     Fields& operator=(const Fields&) = delete;
@@ -179,6 +184,7 @@ private:
     };
 
     const bool m_loading;
+    const bool m_keepsEntries;
     Position m_position;
 };
 

@@ -14,7 +14,9 @@ template <class Route>
 class StreamFields : public Fields
 {
 protected:
-    StreamFields(bool loading, Route& route) : Fields(loading), m_route(route), m_stream(route.stream()) {}
+    StreamFields(bool loading, Route& route)
+        : Fields(loading, loading), m_route(route), m_stream(route.stream())
+    {}
 
     Route& m_route;
     IFieldStream& m_stream;

@@ -207,13 +207,44 @@ struct ItemsOf<std::set<T, Less>>
     }
 };
 
-/// The entry of a map while it is read: its key first, and then the value at its place in the map.
+/// A map while its entries are read. Those that it had before are kept aside, so that a key that is read
+/// twice is told from one that was there, and are back in their places at the end, however that comes.
+template <class Map>
+struct MapReading
+{
+    MapReading(Map& target, bool keepsEntries) : map(target)
+    {
+        if (keepsEntries)
+            earlier.swap(map);
+        else
+            map.clear();
+    }
+    ~MapReading() { map.merge(earlier); }
+    MapReading(const MapReading&) = delete;
+    MapReading& operator=(const MapReading&) = delete;
+
+    /// The value to read into: the earlier one with the key, where there is one.
+    typename Map::mapped_type& place(typename Map::key_type&& key)
+    {
+        if (auto node = earlier.extract(key))
+            return map.insert(std::move(node)).position->second;
+        const auto entry = map.try_emplace(std::move(key));
+        if (!entry.second)
+            throwRepeatedKey();
+        return entry.first->second;
+    }
+
+    Map& map;
+    Map earlier;
+};
+
+/// One entry of a map: its key is read first, and then the value at its place in the map.
 template <class Map>
 struct MapEntry
 {
     using Pair = typename Map::value_type;
 
-    Map* map;
+    MapReading<Map>* reading;
     Pair* pair;
 
     static void visit(Fields& fields, void* object)
@@ -226,10 +257,7 @@ struct MapEntry
         }
         typename Map::key_type key{};
         fields({"first", "Key"}, key);
-        const auto place = entry.map->try_emplace(std::move(key));
-        if (!place.second)
-            throwRepeatedKey();
-        fields({"second", "Value"}, place.first->second);
+        fields({"second", "Value"}, entry.reading->place(std::move(key)));
     }
 
     static const Type& type()
@@ -248,16 +276,26 @@ struct ItemsOf<std::map<K, V, Less>>
     static void visit(Fields& fields, Map& map)
     {
         const int count = fields.beginSequence(Collection, static_cast<int>(map.size()));
-        if (fields.loading())
-            map.clear();
-        auto position = map.begin();
+        if (fields.loading()) {
+            MapReading<Map> reading(map, fields.keepsEntries());
+            visitEntries(fields, count, [&] { return MapEntry<Map>{&reading, nullptr}; });
+        } else {
+            auto position = map.begin();
+            visitEntries(fields, count, [&] { return MapEntry<Map>{nullptr, &*position++}; });
+        }
+        fields.endSequence(count);
+    }
+
+private:
+    template <class Next>
+    static void visitEntries(Fields& fields, int count, Next next)
+    {
         for (int index = 1; index <= count; ++index) {
             fields.beginItem(index);
-            MapEntry<Map> entry{&map, fields.loading() ? nullptr : &*position++};
+            MapEntry<Map> entry = next();
             fields.entry(MapEntry<Map>::type(), &entry);
             fields.endItem(index);
         }
-        fields.endSequence(count);
     }
 };
 
