@@ -54,6 +54,7 @@
 #include <EditorModel/services/Statistics.h>
 #include <EditorModel/services/Task.h>
 #include <EditorModel/services/Tutorial.h>
+#include <EditorModel/timeline/Composition.h>
 #include <EditorModel/types/AvTime.h>
 #include <EditorModel/types/Decibel.h>
 #include <EditorModel/types/FuzzyCompare.h>
