@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/media/Media.h>
+#include <EditorModel/timeline/Composition.h>
 
 #include <gmock/gmock.h>
 
@@ -26,11 +27,10 @@ static_assert(std::is_convertible_v<Track::Video*, Serialize::ISerializable*>);
 static_assert(std::is_convertible_v<Track::Audio*, PubSub::Object*>);
 static_assert(std::is_convertible_v<Track::Video*, Media::Video*>);
 
-/// A file never looks into these.
 const Composition::Object* someComposition()
 {
-    static const char place = 0;
-    return reinterpret_cast<const Composition::Object*>(&place);
+    static const Composition::Object composition;
+    return &composition;
 }
 
 struct Fixture
