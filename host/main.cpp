@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Console.h"
+#include "CurveCommand.h"
 #include "DisplayText.h"
 #include "MediaProbe.h"
 #include "ProbeCommand.h"
@@ -9,12 +10,15 @@
 
 #include <QCoreApplication>
 #include <QFile>
+#include <QGuiApplication>
 
 #include <CLI/CLI.hpp>
 
 #include <clocale>
 #include <cstdlib>
 #include <exception>
+#include <map>
+#include <memory>
 #include <new>
 #include <string>
 #include <vector>
@@ -34,6 +38,7 @@ void useUtf8()
     std::setlocale(LC_ALL, "");
     if (std::string(nl_langinfo(CODESET)) != "UTF-8") {
         setenv("LC_ALL", "C.UTF-8", 1);
+        std::setlocale(LC_ALL, "");
     }
 }
 
@@ -64,6 +69,12 @@ struct Arguments
     std::string document;
     bool json = false;
     bool verbose = false;
+
+    std::string picture;
+    Host::CurveOptions curve;
+    qint64 length = 10000;
+    qint64 fadeIn = 0;
+    qint64 fadeOut = 0;
 };
 
 Host::ExitCode runProbe(const Arguments& arguments)
@@ -78,39 +89,122 @@ Host::ExitCode runProbe(const Arguments& arguments)
     return Host::probe(options);
 }
 
+Host::ExitCode runCurve(const Arguments& arguments)
+{
+    Host::CurveOptions options = arguments.curve;
+    options.document = fileName(arguments.document);
+    options.picturePath = fileName(arguments.picture);
+    options.span = {arguments.length, arguments.fadeIn, arguments.fadeOut};
+    return Host::curve(options);
+}
+
+CLI::App* addProbe(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const probe = app.add_subcommand("probe", "Describe media files");
+    probe->add_option("FILE", arguments.files, "Video, sound or picture files")->required()->type_name("");
+    probe
+        ->add_option("--save", arguments.document,
+                     "Save the descriptions and the resources as a document: .json, .xml or .bin")
+        ->type_name("PATH")
+        ->check(checkDocumentName);
+    probe->add_flag("--json", arguments.json, "Print JSON instead of a table");
+    probe->add_flag("--verbose", arguments.verbose, "Let FFmpeg's libraries tell what they do");
+    return probe;
+}
+
+CLI::App* addShow(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const show = app.add_subcommand("show", "Show the descriptions in a document");
+    show->add_option("DOCUMENT", arguments.document, "A document that probe has saved")
+        ->required()
+        ->type_name("");
+    return show;
+}
+
+CLI::App* addCurve(CLI::App& app, Arguments& arguments)
+{
+    const std::map<std::string, Host::CurveSample> samples = {{"volume", Host::VolumeSample},
+                                                              {"transformation", Host::TransformationSample}};
+    // Up to 99:59:59.999, which is what a label has room for.
+    constexpr qint64 longest = 359999999;
+    const CLI::Validator milliseconds = CLI::Range(qint64(0), longest).description("");
+
+    CLI::App* const curve = app.add_subcommand("curve", "Show how an envelope goes");
+    curve->add_option("DOCUMENT", arguments.document, "A document with a volume or transformation envelope")
+        ->required()
+        ->type_name("");
+    curve->add_option("-o,--output", arguments.picture, "Draw it as a picture too: .png or .svg")
+        ->type_name("PATH");
+    curve->add_option("--length", arguments.length, "How long the envelope is played, in milliseconds")
+        ->type_name("MS")
+        ->check(CLI::Range(qint64(1), longest).description(""))
+        ->capture_default_str();
+    curve->add_option("--fade-in", arguments.fadeIn, "The length of a fade-in of the volume")
+        ->type_name("MS")
+        ->check(milliseconds);
+    curve->add_option("--fade-out", arguments.fadeOut, "The length of a fade-out of the volume")
+        ->type_name("MS")
+        ->check(milliseconds);
+    curve->add_option("--steps", arguments.curve.steps, "How many steps the table has")
+        ->type_name("N")
+        ->check(CLI::Range(1, 10000).description(""))
+        ->capture_default_str();
+    curve
+        ->add_option("--sample", arguments.curve.sample,
+                     "Make the document first, with an envelope to look at: volume or transformation")
+        ->type_name("KIND")
+        ->transform(CLI::CheckedTransformer(samples, CLI::ignore_case).description(""));
+    curve->add_flag("--own", arguments.curve.isOwn,
+                    "Read binary and XML archives too, which must be of your own making");
+    return curve;
+}
+
+void showGraveMessages(QtMsgType type, const QMessageLogContext&, const QString& message)
+{
+    if (type == QtCriticalMsg || type == QtFatalMsg) {
+        Host::writeError(message);
+    }
+}
+
+/// Pictures need fonts, and those a platform; it has no windows, so that it needs no screen.
+std::unique_ptr<QCoreApplication> makeApplication(bool draws, int& argc, char** argv)
+{
+    if (!draws) {
+        return std::make_unique<QCoreApplication>(argc, argv);
+    }
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    // On a machine without a session Qt warns of folders that no picture needs.
+    const QtMessageHandler before = qInstallMessageHandler(showGraveMessages);
+    auto application = std::make_unique<QGuiApplication>(argc, argv);
+    qInstallMessageHandler(before);
+    return application;
+}
+
 } // namespace
 
 int main(int argc, char** argv)
 {
     useUtf8();
-    const QCoreApplication application(argc, argv);
 
     Arguments arguments;
-    CLI::App app("Describes media files, and shows descriptions that were saved.", "editormodel");
+    CLI::App app("Describes media files, shows what was saved of them, and draws envelopes.", "editormodel");
     app.require_subcommand(1);
     app.failure_message(usageMessage);
-
-    CLI::App* const probe = app.add_subcommand("probe", "Describe media files");
-    probe->add_option("FILE", arguments.files, "Video, sound or picture files")->required()->type_name("");
-    probe
-        ->add_option("--save", arguments.document, "Save the descriptions as a document: .json, .xml or .bin")
-        ->type_name("PATH")
-        ->check(checkDocumentName);
-    probe->add_flag("--json", arguments.json, "Print JSON instead of a table");
-    probe->add_flag("--verbose", arguments.verbose, "Let FFmpeg's libraries tell what they do");
-
-    CLI::App* const show = app.add_subcommand("show", "Show the descriptions in a document");
-    show->add_option("DOCUMENT", arguments.document, "A document that probe has saved")
-        ->required()
-        ->type_name("");
-
+    const CLI::App* const probe = addProbe(app, arguments);
+    const CLI::App* const show = addShow(app, arguments);
+    const CLI::App* const curve = addCurve(app, arguments);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
         return refuse(app, error) == 0 ? Host::Success : Host::UsageError;
     }
+
+    const auto application = makeApplication(curve->parsed() && !arguments.picture.empty(), argc, argv);
     try {
-        return probe->parsed() ? runProbe(arguments) : Host::show(fileName(arguments.document));
+        if (probe->parsed()) {
+            return runProbe(arguments);
+        }
+        return show->parsed() ? Host::show(fileName(arguments.document)) : runCurve(arguments);
     } catch (const std::bad_alloc&) {
         Host::writeError(QStringLiteral("there is not enough memory"));
     } catch (const std::exception& error) {

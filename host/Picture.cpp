@@ -1,0 +1,73 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "Picture.h"
+
+#include <QBuffer>
+#include <QImage>
+#include <QPainter>
+#include <QSaveFile>
+#include <QSvgGenerator>
+
+namespace Host {
+namespace {
+
+void paint(const Picture& picture, QPaintDevice& device, double scale)
+{
+    QPainter painter(&device);
+    painter.setRenderHints(QPainter::Antialiasing | QPainter::TextAntialiasing);
+    painter.scale(scale, scale);
+    picture.draw(painter);
+}
+
+QByteArray pngOf(const Picture& picture)
+{
+    QImage image(picture.size() * pngScale, QImage::Format_RGB32);
+    image.fill(Qt::white);
+    paint(picture, image, pngScale);
+    QBuffer buffer;
+    buffer.open(QBuffer::WriteOnly);
+    if (!image.save(&buffer, "PNG")) {
+        throw PictureError("cannot be written: the picture cannot be encoded");
+    }
+    return buffer.data();
+}
+
+QByteArray svgOf(const Picture& picture)
+{
+    QBuffer buffer;
+    QSvgGenerator generator;
+    generator.setOutputDevice(&buffer);
+    // That of a CSS pixel, so that the drawing has its own size in a browser.
+    generator.setResolution(96);
+    generator.setTitle(picture.title());
+    generator.setDescription(QString());
+    generator.setSize(picture.size());
+    generator.setViewBox(QRect(QPoint(), picture.size()));
+    paint(picture, generator, 1.0);
+    return buffer.data();
+}
+
+} // namespace
+
+std::optional<PictureForm> pictureFormOfPath(const QString& path)
+{
+    if (path.endsWith(".png", Qt::CaseInsensitive)) {
+        return Png;
+    }
+    if (path.endsWith(".svg", Qt::CaseInsensitive)) {
+        return Svg;
+    }
+    return std::nullopt;
+}
+
+PictureError::PictureError(const QString& why) : std::runtime_error(why.toStdString()), reason(why) {}
+
+void savePicture(const Picture& picture, const QString& path, PictureForm form)
+{
+    const QByteArray content = form == Png ? pngOf(picture) : svgOf(picture);
+    QSaveFile file(path);
+    if (!file.open(QSaveFile::WriteOnly) || file.write(content) != content.size() || !file.commit()) {
+        throw PictureError("cannot be written: " + file.errorString());
+    }
+}
+
+} // namespace Host
