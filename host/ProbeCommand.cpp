@@ -1,53 +1,69 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ProbeCommand.h"
 
-#include "MediaDescriber.h"
+#include "AnalysisProgress.h"
+#include "AnalysisRunner.h"
+#include "Interrupt.h"
 #include "MediaJson.h"
 #include "MediaOpener.h"
 #include "MediaTable.h"
 #include "ProgressBar.h"
+#include "ResourceKeeper.h"
 
 #include <EditorModel/bus/View.h>
+#include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/persistence/Document.h>
-#include <EditorModel/services/Report.h>
 
 #include <cstdio>
+#include <deque>
 
 namespace Host {
 namespace {
 
-void describeAll(MediaDescriber& describer, const QStringList& paths)
+using Entries = std::deque<MediaDescriber::Entry>;
+
+/// The job is cancelled if the user interrupts the process.
+void analyse(AnalysisRunner& runner, FileAnalyzer::Object& job, const QStringList& paths)
 {
-    Report::Progress progress;
-    Message::View<Report::Progress> reporter;
-    reporter.own(&progress)->setTotal(paths.size());
-    const ProgressBar bar(&progress, stderr);
-    for (const QString& path : paths) {
-        reporter.change(&progress)->setLabel(path);
-        describer.describe(path);
-        reporter.change(&progress)->setPassed(progress.passed + 1);
-    }
-    reporter.remove(&progress);
+    const Interrupt interrupt;
+    const AnalysisProgress progress(&job, paths, interrupt);
+    const ProgressBar bar(progress.progress(), stderr);
+    runner.run();
 }
 
-bool print(const MediaDescriber& describer, bool asJson)
+bool print(const FileAnalyzer::Object& job, const Entries& entries, bool asJson)
 {
     if (asJson) {
-        return writeOutput(mediaJson(describer.entries()));
+        return writeOutput(mediaJson(entries));
     }
-    const std::deque<const Media::File*> files = describer.opened();
-    return files.empty() || writeOutput(mediaTable(files));
+    return job.opened.empty() || writeOutput(mediaTable(job.opened));
 }
 
-bool save(const MediaDescriber& describer, const QString& path)
+/// Has the resources of the files entered into a table.
+void fillTable(ResourceTable::Object& table, const std::deque<const Media::File*>& files)
 {
-    const std::deque<const Media::File*> files = describer.opened();
+    const ResourceKeeper keeper;
+    Message::View<ResourceTable::Object> client;
+    client.add(&table);
+    QStringList paths;
+    for (const Media::File* file : files) {
+        paths << file->path;
+    }
+    PubSub::publish(ResourceTable::AddFilesToTableRequest(&table, paths));
+    client.remove(&table);
+}
+
+bool save(const std::deque<const Media::File*>& files, const QString& path)
+{
     if (files.empty()) {
         writeError(path, "is not written: there is nothing to save");
         return false;
     }
     try {
-        const std::deque<const Serialize::ISerializable*> roots(files.begin(), files.end());
+        ResourceTable::Object table;
+        fillTable(table, files);
+        std::deque<const Serialize::ISerializable*> roots(files.begin(), files.end());
+        roots.push_back(&table);
         Document::saveFile(path, roots, Document::formOfPath(path).value(), Document::Stream);
         return true;
     } catch (const Document::Error& error) {
@@ -57,10 +73,10 @@ bool save(const MediaDescriber& describer, const QString& path)
 }
 
 /// Returns whether there was nothing to report.
-bool reportFailures(const MediaDescriber& describer)
+bool reportFailures(const Entries& entries)
 {
     bool allOpened = true;
-    for (const MediaDescriber::Entry& entry : describer.entries()) {
+    for (const MediaDescriber::Entry& entry : entries) {
         if (!entry.file.isOpened) {
             allOpened = false;
             writeError(entry.file.path, entry.reason);
@@ -79,13 +95,18 @@ ExitCode probe(const ProbeOptions& options)
 {
     // The opener holds the tracks and stays until nobody looks at the files any more.
     MediaOpener opener;
-    MediaDescriber describer;
-    describeAll(describer, options.paths);
+    FileAnalyzer::Object job;
+    AnalysisRunner runner;
+    analyse(runner, job, options.paths);
 
-    const bool isPrinted = print(describer, options.json);
-    const bool isOpened = reportFailures(describer);
-    const bool isSaved = options.savePath.isEmpty() || save(describer, options.savePath);
-    return isPrinted && isOpened && isSaved ? Success : Failure;
+    const Entries& entries = runner.entries(&job);
+    const bool isPrinted = print(job, entries, options.json);
+    const bool isOpened = reportFailures(entries);
+    const bool isSaved = options.savePath.isEmpty() || save(job.opened, options.savePath);
+    if (job.canceled()) {
+        writeError(QString("interrupted after %1 of %2 files").arg(entries.size()).arg(options.paths.size()));
+    }
+    return isPrinted && isOpened && isSaved && job.processed() ? Success : Failure;
 }
 
 } // namespace Host

@@ -17,7 +17,9 @@ struct ProbeOptions
 };
 
 /// Describes files on the standard output. Each that cannot be opened has a line on the error output and
-/// makes the command fail; the others are described all the same, and saved if that is wanted.
+/// makes the command fail; the others are described all the same, and saved with a table of their resources
+/// if that is wanted. An interrupt (Ctrl-C) ends it behind the file that is being read: what is known by then
+/// is printed and saved, and the command fails.
 ExitCode probe(const ProbeOptions& options);
 
 } // namespace Host

@@ -3,24 +3,39 @@
 
 #include "MediaInput.h"
 #include "MediaTable.h"
+#include "ResourceText.h"
 
 #include <EditorModel/media/File.h>
+#include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/persistence/Document.h>
 
 #include <deque>
+#include <string>
 
 namespace Host {
 namespace {
 
-std::deque<const Media::File*> filesOf(const Document::Graph& graph)
+/// The roots of this class, in their order.
+template <class T>
+std::deque<const T*> rootsOf(const Document::Graph& graph)
 {
-    std::deque<const Media::File*> files;
+    std::deque<const T*> found;
     for (const Serialize::ISerializable* root : graph.roots()) {
-        if (const auto* const file = dynamic_cast<const Media::File*>(root)) {
-            files.push_back(file);
+        if (const auto* const object = dynamic_cast<const T*>(root)) {
+            found.push_back(object);
         }
     }
-    return files;
+    return found;
+}
+
+std::string textOf(const Document::Graph& graph)
+{
+    const std::deque<const Media::File*> files = rootsOf<Media::File>(graph);
+    std::string text = files.empty() ? std::string() : mediaTable(files);
+    for (const ResourceTable::Object* table : rootsOf<ResourceTable::Object>(graph)) {
+        text += (text.empty() ? "" : "\n") + resourceText(*table);
+    }
+    return text;
 }
 
 } // namespace
@@ -31,12 +46,12 @@ ExitCode show(const QString& path)
         requireFile(path);
         // What --save writes is read from anybody; nothing else needs to be.
         const Document::Graph graph = Document::loadFile(path, Document::ForeignDocuments);
-        const std::deque<const Media::File*> files = filesOf(graph);
-        if (files.empty()) {
-            writeError(path, "holds no descriptions of media files");
+        const std::string text = textOf(graph);
+        if (text.empty()) {
+            writeError(path, "holds neither descriptions of media files nor resources");
             return Failure;
         }
-        return writeOutput(mediaTable(files)) ? Success : Failure;
+        return writeOutput(text) ? Success : Failure;
     } catch (const MediaError& error) {
         writeError(path, error.reason);
         return Failure;

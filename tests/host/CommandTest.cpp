@@ -1,9 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Samples.h"
 
+#include <EditorModel/effects/Envelope.h>
 #include <EditorModel/media/File.h>
+#include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/persistence/Document.h>
 
+#include <QImage>
 #include <QProcess>
 #include <QProcessEnvironment>
 #include <QStringList>
@@ -181,8 +184,8 @@ TEST(ProbeCommand, DrawsItsProgressOnATerminalOnly)
 TEST(Command, TellsHowItIsUsed)
 {
     for (const QStringList& wrong :
-         {QStringList(), QStringList("probe"), QStringList("show"), QStringList("nonsense"),
-          QStringList({"probe", "a.wav", "--save", "a.doc"}),
+         {QStringList(), QStringList("probe"), QStringList("show"), QStringList("curve"),
+          QStringList("nonsense"), QStringList({"probe", "a.wav", "--save", "a.doc"}),
           QStringList({"probe", "--no-such-option", "a"})}) {
         const Outcome outcome = editormodel(wrong);
         EXPECT_EQ(outcome.exitCode, 2) << wrong.join(' ').toStdString();
@@ -191,10 +194,12 @@ TEST(Command, TellsHowItIsUsed)
     }
     const Outcome help = editormodel({"--help"});
     EXPECT_EQ(help.exitCode, 0);
-    EXPECT_THAT(help.output, AllOf(HasSubstr("probe"), HasSubstr("show")));
+    EXPECT_THAT(help.output, AllOf(HasSubstr("probe"), HasSubstr("show"), HasSubstr("curve")));
 }
 
 class SavedDescriptions : public testing::TestWithParam<const char*>
+{};
+class SavedEnvelopes : public testing::TestWithParam<const char*>
 {};
 
 TEST_P(SavedDescriptions, AreShownInTheTableThatProbePrinted)
@@ -208,7 +213,13 @@ TEST_P(SavedDescriptions, AreShownInTheTableThatProbePrinted)
     const Outcome shown = editormodel({"show", document});
     EXPECT_EQ(shown.exitCode, 0);
     EXPECT_THAT(shown.errors, IsEmpty());
-    EXPECT_EQ(shown.output, probed.output);
+    EXPECT_THAT(shown.output, StartsWith(probed.output + "\nResource "));
+    EXPECT_THAT(shown.output, hasLine({".*", "video", "#2", "00:00:01.024", sample("tracks.mkv")}));
+    EXPECT_THAT(shown.output, hasLine({".*-2", "audio", "#4", "00:00:01.024", sample("tracks.mkv")}));
+    EXPECT_THAT(shown.output, hasLine({".*", "picture", "#0", "-", sample("picture.png")}));
+    EXPECT_EQ(std::count(shown.output.begin(), shown.output.end(), '\n') -
+                  std::count(probed.output.begin(), probed.output.end(), '\n'),
+              2 + 2 + 5 + 2 + 1 + 2);
 }
 
 TEST_P(SavedDescriptions, AreThoseOfTheFilesThatCouldBeOpened)
@@ -218,7 +229,79 @@ TEST_P(SavedDescriptions, AreThoseOfTheFilesThatCouldBeOpened)
     const Outcome probed =
         editormodel({"probe", "speech.wav", "missing.wav", "--save", document}, sample(""));
     EXPECT_EQ(probed.exitCode, 1);
-    EXPECT_EQ(editormodel({"show", document}).output, probed.output);
+    const Outcome shown = editormodel({"show", document});
+    EXPECT_THAT(shown.output, StartsWith(probed.output + "\nResource "));
+    EXPECT_THAT(shown.output, EndsWith(sample("speech.wav").toStdString() + "\n"));
+    EXPECT_THAT(shown.output, Not(HasSubstr("missing.wav")));
+}
+
+TEST_P(SavedDescriptions, AreShownWithoutResourcesWhereNoneWereSaved)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("files.") + GetParam());
+    Media::File file;
+    file.setPath("old.wav")->setFormat("wav")->setSize(7);
+    Document::saveFile(document, {&file}, *Document::formOfPath(document), Document::Stream);
+    EXPECT_EQ(editormodel({"show", document}).output, "File     Format  Length  Size\n"
+                                                      "old.wav  wav          -   7 B\n");
+}
+
+TEST_P(SavedDescriptions, MayBeResourcesAlone)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("resources.") + GetParam());
+    ResourceTable::Object table;
+    table.resource2fileInfo[{"a\n1", Resource::NoType}].info.path = "some.mov";
+    ResourceTable::FileResourceInfo& sound = table.resource2fileInfo[{"b", Resource::AudioType}];
+    sound.info.track = 1;
+    sound.info.duration = MTime(1500);
+    Document::saveFile(document, {&table}, *Document::formOfPath(document), Document::Stream);
+    EXPECT_EQ(editormodel({"show", document}).output, "Resource  Kind   Track        Length  File\n"
+                                                      "a\\x0a1    -      #0                -  some.mov\n"
+                                                      "b         audio  #1     00:00:01.500\n");
+}
+
+TEST_P(SavedDescriptions, AreNoEnvelopes)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("media.") + GetParam());
+    ASSERT_EQ(editormodel({"probe", "speech.wav", "--save", document}, sample("")).exitCode, 0);
+    const Outcome outcome = editormodel({"curve", document});
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_THAT(outcome.output, IsEmpty());
+    EXPECT_EQ(outcome.errors,
+              document.toStdString() + ": holds neither a volume nor a transformation envelope, but File\n");
+}
+
+TEST_P(SavedEnvelopes, AreNoDescriptions)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("curve.") + GetParam());
+    ASSERT_EQ(editormodel({"curve", "--sample", "volume", document}).exitCode, 0);
+    const Outcome shown = editormodel({"show", document});
+    EXPECT_EQ(shown.exitCode, 1);
+    EXPECT_THAT(shown.errors, HasSubstr("holds neither descriptions of media files nor resources"));
+}
+
+TEST_P(SavedEnvelopes, AreReadInEveryForm)
+{
+    const Folder folder;
+    const QString document = folder.path(QString("curve.") + GetParam());
+    const Outcome made = editormodel({"curve", "--sample", "volume", document, "--steps", "4"});
+    EXPECT_EQ(made.exitCode, 0) << made.errors;
+    EXPECT_THAT(made.output, StartsWith("Volume envelope: 7 keys over 00:00:10.000\n"));
+    EXPECT_THAT(made.output, hasLine({"#4", "00:00:03.800", "0.38", "25 %", "-12.0 dB"}));
+    EXPECT_THAT(made.output, hasLine({"00:00:05.000", "25 %", "-12.0 dB"}));
+    EXPECT_EQ(editormodel({"curve", document, "--steps", "4"}).output, made.output);
+
+    VolumeEnvelope envelope;
+    envelope.addKeyValue(0.5, 0.5);
+    Document::saveFile(document, {&envelope}, *Document::formOfPath(document), Document::Archive);
+    const Outcome own = editormodel({"curve", "--own", document});
+    EXPECT_EQ(own.exitCode, 0) << own.errors;
+    EXPECT_THAT(own.output, hasLine({"#1", "00:00:05.000", "0.5", "50 %", "-6.0 dB"}));
+    // Boost's readers do not withstand malice.
+    EXPECT_EQ(editormodel({"curve", document}).exitCode, std::string(GetParam()) == "json" ? 0 : 1);
 }
 
 TEST_P(SavedDescriptions, AreRefusedInOneLineIfTheyAreDamaged)
@@ -237,6 +320,8 @@ TEST_P(SavedDescriptions, AreRefusedInOneLineIfTheyAreDamaged)
 }
 
 INSTANTIATE_TEST_SUITE_P(Forms, SavedDescriptions, testing::Values("json", "xml", "bin"),
+                         [](const auto& form) { return std::string(form.param); });
+INSTANTIATE_TEST_SUITE_P(Forms, SavedEnvelopes, testing::Values("json", "xml", "bin"),
                          [](const auto& form) { return std::string(form.param); });
 
 TEST(ShowCommand, TellsInOneLineThatAFileIsNoDocument)
@@ -273,6 +358,66 @@ TEST(ShowCommand, TakesNoArchiveThatOneMustTrust)
         const Outcome shown = editormodel({"show", path});
         EXPECT_EQ(shown.exitCode, 1);
         EXPECT_THAT(shown.errors, HasSubstr("an archive of this form is taken from oneself alone"));
+    }
+}
+
+TEST(CurveCommand, DrawsPicturesOfBothEnvelopes)
+{
+    const Folder folder;
+    const Outcome volume = editormodel({"curve", "--sample", "volume", "v.json", "-o", "v.png", "--fade-in",
+                                        "1000", "--fade-out", "2500", "--length", "20000"},
+                                       folder.path());
+    EXPECT_EQ(volume.exitCode, 0);
+    EXPECT_THAT(volume.errors, IsEmpty());
+    EXPECT_THAT(volume.output, StartsWith("Volume envelope: 7 keys over 00:00:20.000, fade-in 00:00:01.000, "
+                                          "fade-out 00:00:02.500\n"));
+    EXPECT_EQ(QImage(folder.path("v.png")).size(), QSize(2560, 1200));
+
+    const Outcome transformation =
+        editormodel({"curve", "--sample", "transformation", "t.bin", "-o", "t.svg"}, folder.path());
+    EXPECT_EQ(transformation.exitCode, 0);
+    EXPECT_THAT(transformation.errors, IsEmpty());
+    EXPECT_THAT(transformation.output, hasLine({"Opacity", ".*", "0 %", "100 %"}));
+    EXPECT_TRUE(contentOf(folder.path("t.svg")).contains("<svg "));
+}
+
+TEST(CurveCommand, TellsInOneLineWhatIsWrong)
+{
+    const Folder folder;
+    ASSERT_EQ(editormodel({"curve", "--sample", "transformation", folder.path("t.json")}).exitCode, 0);
+    folder.write("letter.json", "Dear Sir or Madam,\n");
+    const std::pair<QStringList, const char*> wrong[] = {
+        {{"missing.json"}, "missing.json: does not exist\n"},
+        {{"."}, ".: is a folder\n"},
+        {{"/dev/zero"}, "/dev/zero: is not a regular file\n"},
+        {{"letter.json"}, "letter.json: "},
+        {{"t.json", "-o", "t.gif"}, "t.gif: is no name of a picture: such a name ends in .png or .svg\n"},
+        {{"t.json", "--fade-in", "5"}, "t.json: holds a transformation envelope, which takes no fades\n"},
+        {{"--sample", "volume", "t.doc"},
+         "t.doc: is no name of a document: such a name ends in .json, .xml or .bin\n"},
+    };
+    for (const auto& [arguments, error] : wrong) {
+        const Outcome outcome = editormodel(QStringList("curve") + arguments, folder.path());
+        EXPECT_EQ(outcome.exitCode, 1) << error;
+        EXPECT_THAT(outcome.output, IsEmpty()) << error;
+        EXPECT_THAT(outcome.errors, StartsWith(error));
+        EXPECT_EQ(std::count(outcome.errors.begin(), outcome.errors.end(), '\n'), 1) << outcome.errors;
+    }
+    const Outcome unwritten = editormodel({"curve", "t.json", "-o", "/no/such/folder/t.png"}, folder.path());
+    EXPECT_EQ(unwritten.exitCode, 1);
+    EXPECT_THAT(unwritten.output, StartsWith("Transformation envelope"));
+    EXPECT_THAT(unwritten.errors, StartsWith("/no/such/folder/t.png: cannot be written: "));
+    EXPECT_EQ(std::count(unwritten.errors.begin(), unwritten.errors.end(), '\n'), 1) << unwritten.errors;
+}
+
+TEST(CurveCommand, TakesNoNumbersThatMakeNoSense)
+{
+    for (const QStringList& options : {QStringList({"--length", "0"}), QStringList({"--length", "360000000"}),
+                                       QStringList({"--fade-in", "-1"}), QStringList({"--steps", "0"}),
+                                       QStringList({"--steps", "x"}), QStringList({"--sample", "colour"})}) {
+        const Outcome outcome = editormodel(QStringList({"curve", "a.json"}) + options);
+        EXPECT_EQ(outcome.exitCode, 2) << options.join(' ').toStdString();
+        EXPECT_THAT(outcome.output, IsEmpty());
     }
 }
 
