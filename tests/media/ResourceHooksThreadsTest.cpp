@@ -166,8 +166,10 @@ TEST(ResourceHooksThreads, TheFourHooksOfAProviderAreEmptiedOneAfterTheOther)
     engine.onNextAudio = [&] {
         leaving = std::async(std::launch::async, [&] { copy.reset(); });
         // The video hook is emptied and let go of, and then the audio hook is waited for.
-        while (VideoProvider("d", nullptr).resource())
+        const auto deadline = std::chrono::steady_clock::now() + 60s;
+        while (VideoProvider("d", nullptr).resource() && std::chrono::steady_clock::now() < deadline)
             std::this_thread::yield();
+        EXPECT_FALSE(VideoProvider("d", nullptr).resource());
         EXPECT_TRUE(isHeldBack(leaving));
         EXPECT_TRUE(ImageProvider("c", nullptr).resource());
         EXPECT_TRUE(BlobProvider("b", nullptr).resource());
