@@ -442,4 +442,9 @@ TEST(AnimationArchive, IsReadInTheOrderOfTheFile)
     }
 }
 
+TEST(Animation, NamesTheMimeTypeOfAnItem)
+{
+    EXPECT_EQ(*Animation::itemMimeType, "x-application/AnimationItem-serialized");
+}
+
 } // namespace

@@ -124,12 +124,12 @@ TEST(Effect, CopiesWhole)
 
 TEST(Effect, HasAMimeTypeForPicturesAndOneForSound)
 {
-    EXPECT_EQ(Effect::Object::videoMimeType, "x-application/VideoEffectObject-serialized");
-    EXPECT_EQ(Effect::Object::audioMimeType, "x-application/AudioEffectObject-serialized");
-    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Video), &Effect::Object::videoMimeType);
-    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Audio), &Effect::Object::audioMimeType);
-    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Type(0)), &Effect::Object::videoMimeType);
-    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Type(1)), &Effect::Object::audioMimeType);
+    EXPECT_EQ(*Effect::Object::videoMimeType, "x-application/VideoEffectObject-serialized");
+    EXPECT_EQ(*Effect::Object::audioMimeType, "x-application/AudioEffectObject-serialized");
+    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Video), Effect::Object::videoMimeType);
+    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Audio), Effect::Object::audioMimeType);
+    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Type(0)), Effect::Object::videoMimeType);
+    EXPECT_EQ(Effect::Object::mimeType(Effect::Object::Type(1)), Effect::Object::audioMimeType);
 }
 
 TEST(Effect, HasNoMimeTypeForAnythingElse)

@@ -332,7 +332,7 @@ TEST(OverlayPreset, IsWrittenInTheOrderOfItsFields)
 
 TEST(OverlayPreset, HasAMimeType)
 {
-    EXPECT_EQ(Preset::mimeType, "x-application/OverlayPreset-serialized");
+    EXPECT_EQ(*Preset::mimeType, "x-application/OverlayPreset-serialized");
 }
 
 TEST(OverlayPreset, PutsItemsAtEitherEnd)

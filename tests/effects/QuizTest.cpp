@@ -170,7 +170,7 @@ TEST(QuizPreset, TheOrderOfAnswersCounts)
 
 TEST(QuizPreset, HasAMimeType)
 {
-    EXPECT_EQ(Quiz::Preset::mimeType, "x-application/QuizPreset-serialized");
+    EXPECT_EQ(*Quiz::Preset::mimeType, "x-application/QuizPreset-serialized");
 }
 
 TEST(QuizPreset, IsWrittenInTheOrderOfItsFields)

@@ -92,7 +92,7 @@ TEST(Transition, ResourcesCountWhateverTheirIdentifiers)
 
 TEST(Transition, HasAMimeType)
 {
-    EXPECT_EQ(Transition::Object::mimeType, "x-application/TransitionObject-serialized");
+    EXPECT_EQ(*Transition::Object::mimeType, "x-application/TransitionObject-serialized");
 }
 
 TEST(Transition, IsWrittenWithItsResourcesInFrontOfItsDuration)

@@ -5,11 +5,16 @@
 #include <EditorModel/bus/PubSub.h>
 #include <EditorModel/persistence/Persistent.h>
 
+#include <QString>
+
 #include <deque>
 #include <optional>
 #include <utility>
 
 namespace Animation {
+
+/// "x-application/AnimationItem-serialized": an envelope on the clipboard.
+EDITORMODEL_EXPORT extern const QString* const itemMimeType;
 
 /// Names the value type of an envelope, `ValueType`, and the value of an empty one, `s_defaultValue`.
 template <class T>

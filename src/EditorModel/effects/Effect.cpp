@@ -5,16 +5,13 @@
 
 namespace Effect {
 
-const QString Object::videoMimeType = QStringLiteral("x-application/VideoEffectObject-serialized");
-const QString Object::audioMimeType = QStringLiteral("x-application/AudioEffectObject-serialized");
-
 const QString* Object::mimeType(Type type)
 {
     switch (type) {
     case Video:
-        return &videoMimeType;
+        return videoMimeType;
     case Audio:
-        return &audioMimeType;
+        return audioMimeType;
     }
     return nullptr;
 }

@@ -35,8 +35,10 @@ public:
         DefaultImpl = 1,
     };
 
-    static const QString videoMimeType;
-    static const QString audioMimeType;
+    /// "x-application/VideoEffectObject-serialized", for the clipboard and for drag and drop.
+    static const QString* const videoMimeType;
+    /// "x-application/AudioEffectObject-serialized".
+    static const QString* const audioMimeType;
     /// Null for a type that is neither of the two.
     static const QString* mimeType(Type type);
 

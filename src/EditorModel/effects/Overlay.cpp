@@ -20,8 +20,6 @@ bool isSamePen(const Types::Pen& a, const Types::Pen& b)
 
 } // namespace
 
-const QString Preset::mimeType = QStringLiteral("x-application/OverlayPreset-serialized");
-
 DropShadow::DropShadow() = default;
 
 DropShadow::DropShadow(unsigned color_) : enabled(true), color(color_) {}

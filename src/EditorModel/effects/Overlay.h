@@ -101,7 +101,7 @@ public:
         DefaultType = 0,
     };
 
-    static const QString mimeType;
+    static const QString* const mimeType;
 
     Type type = DefaultType;
     /// The script that drives the preset; the rendering module runs it.

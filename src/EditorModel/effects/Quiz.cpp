@@ -5,8 +5,6 @@
 
 namespace Quiz {
 
-const QString Preset::mimeType = QStringLiteral("x-application/QuizPreset-serialized");
-
 bool operator==(const Question& a, const Question& b)
 {
     return &a == &b || (a.type == b.type && a.text == b.text && a.answers == b.answers &&

@@ -38,7 +38,7 @@ class EDITORMODEL_EXPORT Preset : public Serialize::ISerializable, public virtua
     EDITORMODEL_PERSISTENT(Preset)
 
 public:
-    static const QString mimeType;
+    static const QString* const mimeType;
 
     std::deque<Question> questions;
     /// The name in the library.

@@ -5,12 +5,6 @@
 
 namespace Envelope {
 
-namespace {
-const QString presetMimeType = QStringLiteral("x-application/TransformationItem-serialized");
-}
-
-const QString* const TransformationPreset::mimeType = &presetMimeType;
-
 TransformationPreset::TransformationPreset() = default;
 TransformationPreset::~TransformationPreset() = default;
 

@@ -17,8 +17,6 @@ bool hasKind(const std::deque<ResourceRef>& resources, Resource::Type kind)
 
 } // namespace
 
-const QString Object::mimeType = QStringLiteral("x-application/TransitionObject-serialized");
-
 Object::Object(const QString& id_) : id(id_) {}
 
 bool Object::hasVideoResources() const

@@ -32,7 +32,7 @@ public:
     };
 
     static constexpr MTime DEFAULT_DURATION = 2000;
-    static const QString mimeType;
+    static const QString* const mimeType;
 
     QString id;
     /// The name in the library.
