@@ -7,6 +7,7 @@
 #include <EditorModel/Export.h>
 #include <EditorModel/analysis/BeatDetection.h>
 #include <EditorModel/analysis/ClipSynchronization.h>
+#include <EditorModel/analysis/MotionTracking.h>
 #include <EditorModel/analysis/SceneDetection.h>
 #include <EditorModel/analysis/Stabilization.h>
 #include <EditorModel/bus/Messages.h>
@@ -39,6 +40,7 @@
 #include <EditorModel/media/ResourceInfo.h>
 #include <EditorModel/media/ResourceRef.h>
 #include <EditorModel/media/ResourceTable.h>
+#include <EditorModel/media/TimingMode.h>
 #include <EditorModel/media/Video.h>
 #include <EditorModel/media/Views.h>
 #include <EditorModel/persistence/Document.h>
@@ -54,7 +56,9 @@
 #include <EditorModel/services/Statistics.h>
 #include <EditorModel/services/Task.h>
 #include <EditorModel/services/Tutorial.h>
+#include <EditorModel/timeline/ClipOrder.h>
 #include <EditorModel/timeline/Composition.h>
+#include <EditorModel/timeline/Object.h>
 #include <EditorModel/types/AvTime.h>
 #include <EditorModel/types/Decibel.h>
 #include <EditorModel/types/FuzzyCompare.h>

@@ -7,7 +7,7 @@
 #include <set>
 
 namespace Timeline {
-class Clip;
+struct Clip;
 }
 
 namespace ClipSynchronization {
