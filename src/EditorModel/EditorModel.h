@@ -56,9 +56,17 @@
 #include <EditorModel/services/Statistics.h>
 #include <EditorModel/services/Task.h>
 #include <EditorModel/services/Tutorial.h>
+#include <EditorModel/timeline/Clip.h>
 #include <EditorModel/timeline/ClipOrder.h>
+#include <EditorModel/timeline/ClipTiming.h>
 #include <EditorModel/timeline/Composition.h>
+#include <EditorModel/timeline/Label.h>
+#include <EditorModel/timeline/Link.h>
 #include <EditorModel/timeline/Object.h>
+#include <EditorModel/timeline/Timeline.h>
+#include <EditorModel/timeline/Track.h>
+#include <EditorModel/timeline/TrackingLink.h>
+#include <EditorModel/timeline/TransitionType.h>
 #include <EditorModel/types/AvTime.h>
 #include <EditorModel/types/Decibel.h>
 #include <EditorModel/types/FuzzyCompare.h>
