@@ -104,7 +104,7 @@ public:
     Object(const Object&) = default;
     Object(Object&&) = default;
     Object& operator=(const Object&) = default;
-    Object& operator=(Object&&) = default;
+    Object& operator=(Object&& other) noexcept;
     ~Object() override;
 
     // Clips. All but removeClip() and clearClips() enter a clip that isn't there.
@@ -134,8 +134,8 @@ public:
     /// start, transitions and fades stay. The clip must not be null.
     Object* setClipSpeed(const Clip* clip, double speed);
 
-    /// False on the native audio track and for clips of the three intro types. Strict; neither the clip nor
-    /// its track may be null.
+    /// False on a native audio track and for clips of the three intro types. Strict; the track must not be
+    /// null.
     bool canEditTiming(const Clip* clip) const;
     /// Whether the clip can be cut `offset` behind its start: there must be Clip::MIN_DURATION or more from
     /// the inbound transition to the cut, and more than that from the cut to the outbound transition. False
@@ -238,14 +238,14 @@ public:
     /// Null also for a slave whose link names none. Lenient.
     const Clip* masterOf(const Clip* clip) const;
     std::set<const Clip*> findSlaves(const Clip* master) const;
-    /// The clip, on the timeline or not, then its slaves, then theirs, and so on. The links must have no
-    /// cycle: the walk wouldn't end.
+    /// The clip, on the timeline or not, then its slaves, then theirs, and so on; slaves of one master in the
+    /// order of their addresses. Each clip is listed once, also where links that should not form a cycle do.
     std::deque<const Clip*> clipHeap(const Clip* clip) const;
     /// Slaves without a master are listed under null.
     std::map<const Clip*, std::set<const Clip*>> master2slaves() const;
     /// Of the slaves on the track; their masters may lie on any. Slaves without a master are left out.
     std::map<const Clip*, std::set<const Clip*>> master2slaves(const Track* track) const;
-    /// The clip lies on a native audio track, which must not be null. Strict.
+    /// The clip lies on a native audio track; false without a track. Strict.
     bool isNativeAudio(const Clip* clip) const;
     /// The first slave of the clip, by address, on a native audio track; null if there is none. Strict on the
     /// slaves that the walk meets.
