@@ -5,6 +5,8 @@
 #include <EditorModel/persistence/Roots.h>
 #include <EditorModel/persistence/archives/Registration.h>
 
+#include <QSet>
+
 #if defined(__unix__)
 #include <dlfcn.h>
 #endif
@@ -133,8 +135,9 @@ void visitTexts(Fields& fields, QMap<QString, QString>& texts)
 {
     const int count = fields.beginSequence(QtCollection, texts.size());
     const QMap<QString, QString> stored = fields.loading() ? QMap<QString, QString>() : texts;
-    if (fields.loading())
+    if (fields.loading() && !fields.keepsEntries())
         texts.clear();
+    QSet<QString> readKeys;
     auto position = stored.begin();
     for (int index = 1; index <= count; ++index) {
         std::pair<const QString, QString> item;
@@ -153,8 +156,9 @@ void visitTexts(Fields& fields, QMap<QString, QString>& texts)
         fields.entry(entry, &item);
         fields.endItem(index);
         if (fields.loading()) {
-            if (texts.contains(item.first))
+            if (readKeys.contains(item.first))
                 throwRepeatedKey();
+            readKeys.insert(item.first);
             texts.insert(item.first, item.second);
         }
     }

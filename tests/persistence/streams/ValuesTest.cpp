@@ -5,6 +5,8 @@
 #include <EditorModel/types/Rect.h>
 #include <EditorModel/types/Transform.h>
 
+#include <QBuffer>
+
 #include <cmath>
 #include <limits>
 
@@ -294,6 +296,48 @@ TEST_P(Streams, GiveBackEmptyContainers)
     EXPECT_TRUE(copy.falls.empty());
     EXPECT_TRUE(copy.notes.isEmpty());
     EXPECT_TRUE(copy.list.isEmpty());
+}
+
+TEST_P(Streams, AddToTheMapsOfAnObjectThatIsReadIntoAndReplaceItsOtherContainers)
+{
+    Grove stored;
+    stored.numbers = {1, 2};
+    stored.names = {"x"};
+    stored.named["both"].number = 1;
+    stored.named["stored"].number = 2;
+    stored.grid = {{1, {{10, 0.5}}}, {2, {}}};
+    stored.notes = {{"both", "stored"}, {"stored", "stored"}};
+    QBuffer buffer;
+    buffer.open(QIODevice::ReadWrite);
+    const auto writer = Serialize::makeStreamWriter(GetParam(), buffer);
+    writer->writeObject(stored);
+    writer->finish();
+
+    Grove grove;
+    grove.numbers = {7, 8, 9};
+    grove.names = {"y"};
+    grove.named["both"].number = 3;
+    grove.named["both"].text = "replaced";
+    grove.named["own"].number = 4;
+    grove.grid = {{1, {{10, 1.5}, {11, 2.5}}}, {3, {}}};
+    grove.notes = {{"both", "own"}, {"own", "own"}};
+    const Leaf* const place = &grove.named.at("both");
+    const auto reader = Serialize::makeStreamReader(GetParam(), buffer.data());
+    reader->readObject(grove);
+    reader->finish();
+
+    EXPECT_EQ(grove.numbers, (std::deque<int>{1, 2}));
+    EXPECT_EQ(grove.names, (std::set<QString>{"x"}));
+    ASSERT_EQ(grove.named.size(), 3u);
+    EXPECT_EQ(grove.named.at("both").number, 1);
+    EXPECT_EQ(grove.named.at("both").text, "");
+    EXPECT_EQ(&grove.named.at("both"), place);
+    EXPECT_EQ(grove.named.at("stored").number, 2);
+    EXPECT_EQ(grove.named.at("own").number, 4);
+    EXPECT_EQ(grove.grid,
+              (std::map<int, std::map<int, double>>{{1, {{10, 0.5}, {11, 2.5}}}, {2, {}}, {3, {}}}));
+    EXPECT_EQ(grove.notes,
+              (QMap<QString, QString>{{"both", "stored"}, {"own", "own"}, {"stored", "stored"}}));
 }
 
 TEST(BinaryStream, KeepsBytesThatAreNotUtf8)
