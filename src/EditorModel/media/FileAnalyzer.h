@@ -82,8 +82,9 @@ protected:
     void fileAnalyzerChanged(const FileAnalyzer::Object* object, const FileAnalyzer::Object* oldValue,
                              const FileAnalyzer::Object* newValue) override;
 
-    /// Called, before fileAnalyzerChanged(object), for every other status, also on arrival and departure,
-    /// which compare with a queued job. Then follows one of the two below, if it is meant.
+    /// Called where the status differs from `oldStatus`, in front of fileAnalyzerChanged(object); also on
+    /// arrival and departure, which compare with a queued job. Where the new status is canceled or processed,
+    /// the one of that name below follows.
     virtual void statusChanged(const FileAnalyzer::Object* object, FileAnalyzer::Status oldStatus);
     virtual void cancelled(const FileAnalyzer::Object* object);
     virtual void processed(const FileAnalyzer::Object* object);

@@ -72,16 +72,14 @@ struct ResourceTiming
 /// Where in a resource a position of a clip falls. `rangeBegin` and `rangeEnd` bound the stretch that is
 /// mapped, in the time of `position`, which may lie outside of it; `resourceDuration` is the length of one
 /// pass. Both results are zero where the ends of the range are equal or `resourceDuration` isn't positive;
-/// otherwise the engine's describer is asked for the resource's own timing, whatever the mode.
+/// otherwise the engine's describer is asked for the resource's own timing, whatever the mode. The results by
+/// the mode of `timing`, position first:
 ///
-/// | mode                                     | position                            | duration              |
-/// |------------------------------------------|-------------------------------------|-----------------------|
-/// | Described, the describer's is as well    | `position`                          | 0                     |
-/// | Described, the describer's is another    | `position - rangeBegin`             | `rangeEnd - rangeBegin`
-/// | | Stretched                                | the part of the range that has passed, of
-/// `resourceDuration`; rounded | `resourceDuration` | | Looped                                   | `position`
-/// modulo `resourceDuration`, never negative | `resourceDuration` | | any other | `position` |
-/// `resourceDuration`    |
+/// - Described: `position` and 0 where the describer's own mode is that as well, else
+///   `position - rangeBegin` and `rangeEnd - rangeBegin`
+/// - Stretched: the part of the range that has passed, of `resourceDuration`, rounded; `resourceDuration`
+/// - Looped: `position` modulo `resourceDuration`, never negative; `resourceDuration`
+/// - any other: `position` and `resourceDuration`
 EDITORMODEL_EXPORT ResourceTiming getTimings(MTime position, MTime resourceDuration, MTime rangeBegin,
                                              MTime rangeEnd, const ResourceRef& resource,
                                              const Timing& timing);
