@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tests/shared/FieldVisitors.h"
+#include "tests/shared/FieldTexts.h"
 
 #include <EditorModel/effects/Envelope.h>
 #include <EditorModel/persistence/Document.h>
@@ -25,11 +25,17 @@ using ::testing::ElementsAre;
 using ::testing::IsEmpty;
 using ::testing::Pair;
 
-static_assert(std::is_base_of_v<Serialize::ISerializable, KeyValue<double>>);
+template <class T>
+constexpr bool hasPlainRoot =
+    std::is_base_of_v<Serialize::ISerializable, T> && !Testing::isVirtualBase<Serialize::ISerializable, T>;
+
+static_assert(hasPlainRoot<KeyValue<double>>);
+static_assert(hasPlainRoot<KeyValue<Transformation::Object>>);
 static_assert(!std::is_base_of_v<PubSub::Object, KeyValue<double>>);
-static_assert(std::is_base_of_v<Serialize::ISerializable, VolumeEnvelope>);
-static_assert(std::is_base_of_v<PubSub::Object, VolumeEnvelope>);
-static_assert(std::is_base_of_v<PubSub::Object, TransformationEnvelope>);
+static_assert(hasPlainRoot<VolumeEnvelope>);
+static_assert(hasPlainRoot<TransformationEnvelope>);
+static_assert(Testing::isVirtualBase<PubSub::Object, VolumeEnvelope>);
+static_assert(Testing::isVirtualBase<PubSub::Object, TransformationEnvelope>);
 
 constexpr double infinity = std::numeric_limits<double>::infinity();
 constexpr double notANumber = std::numeric_limits<double>::quiet_NaN();

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tests/shared/FieldVisitors.h"
+#include "tests/shared/FieldTexts.h"
 
 #include <EditorModel/effects/TransformationPreset.h>
 
@@ -14,7 +14,8 @@ namespace {
 using Envelope::TransformationPreset;
 
 static_assert(std::is_base_of_v<Serialize::ISerializable, TransformationPreset>);
-static_assert(std::is_base_of_v<PubSub::Object, TransformationPreset>);
+static_assert(!Testing::isVirtualBase<Serialize::ISerializable, TransformationPreset>);
+static_assert(Testing::isVirtualBase<PubSub::Object, TransformationPreset>);
 
 TransformationPreset presetWithEveryFieldSet()
 {

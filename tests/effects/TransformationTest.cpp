@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tests/shared/FieldVisitors.h"
+#include "tests/shared/FieldTexts.h"
 
+#include <EditorModel/bus/PubSub.h>
 #include <EditorModel/effects/Transformation.h>
 
 #include <gtest/gtest.h>
@@ -15,6 +16,8 @@ using Transformation::Object;
 using Types::Transform;
 
 static_assert(std::is_base_of_v<Serialize::ISerializable, Object>);
+static_assert(!Testing::isVirtualBase<Serialize::ISerializable, Object>);
+static_assert(!std::is_base_of_v<PubSub::Object, Object>);
 
 const Transform oneToNine(1, 2, 3, 4, 5, 6, 7, 8, 9);
 

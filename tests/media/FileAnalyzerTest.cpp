@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "tests/shared/FieldTexts.h"
+
 #include <EditorModel/media/FileAnalyzer.h>
 
 #include <EditorModel/media/File.h>
@@ -17,6 +19,8 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using Lines = std::vector<std::string>;
 
+static_assert(Testing::isVirtualBase<PubSub::Object, Object>);
+static_assert(!std::is_base_of_v<Serialize::ISerializable, Object>);
 static_assert(std::is_same_v<std::underlying_type_t<Status>, int>);
 static_assert(Queued == 0 && Processing == 1 && Processed == 2 && Canceled == 3);
 

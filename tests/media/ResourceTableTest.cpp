@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "tests/shared/FieldTexts.h"
+
 #include <EditorModel/media/ResourceTable.h>
 
 #include <EditorModel/bus/View.h>
@@ -20,10 +22,10 @@ using namespace ResourceTable;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-static_assert(std::is_convertible_v<FileResourceInfo*, Serialize::ISerializable*>);
-static_assert(!std::is_convertible_v<FileResourceInfo*, PubSub::Object*>);
-static_assert(std::is_convertible_v<Object*, Serialize::ISerializable*>);
-static_assert(std::is_convertible_v<Object*, PubSub::Object*>);
+static_assert(Testing::isVirtualBase<Serialize::ISerializable, FileResourceInfo>);
+static_assert(!std::is_base_of_v<PubSub::Object, FileResourceInfo>);
+static_assert(Testing::isVirtualBase<Serialize::ISerializable, Object>);
+static_assert(Testing::isVirtualBase<PubSub::Object, Object>);
 
 FileResourceInfo fullInfo(int number)
 {

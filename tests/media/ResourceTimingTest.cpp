@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "tests/shared/FieldTexts.h"
+
 #include <EditorModel/bus/PubSub.h>
 #include <EditorModel/media/Resource.h>
 
@@ -15,9 +17,10 @@ namespace {
 using namespace Resource;
 
 static_assert(std::is_same_v<std::underlying_type_t<Timing::Mode>, int>);
-static_assert(std::is_convertible_v<FileInfo*, Serialize::ISerializable*>);
-static_assert(std::is_convertible_v<Timing*, Serialize::ISerializable*>);
-static_assert(!std::is_convertible_v<FileInfo*, PubSub::Object*>);
+static_assert(Testing::isVirtualBase<Serialize::ISerializable, FileInfo>);
+static_assert(Testing::isVirtualBase<Serialize::ISerializable, Timing>);
+static_assert(!std::is_base_of_v<PubSub::Object, FileInfo>);
+static_assert(!std::is_base_of_v<PubSub::Object, Timing>);
 static_assert(!std::is_polymorphic_v<ResourceTiming>);
 
 TEST(FileInfo, IsEmptyByDefault)

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "tests/shared/FieldTexts.h"
+
 #include <EditorModel/timeline/Composition.h>
 
 #include <EditorModel/bus/View.h>
@@ -22,8 +24,9 @@ static_assert(std::is_base_of_v<Composition::Child, Marker>);
 static_assert(std::is_base_of_v<Composition::Child, Range>);
 static_assert(std::is_base_of_v<Types::Range, Range>);
 static_assert(!std::is_base_of_v<Types::Range, Marker>);
-static_assert(std::is_convertible_v<Composition::Child*, PubSub::Object*>);
-static_assert(std::is_convertible_v<Composition::Object*, PubSub::Object*>);
+static_assert(Testing::isVirtualBase<PubSub::Object, Composition::Child>);
+static_assert(Testing::isVirtualBase<PubSub::Object, Composition::Object>);
+static_assert(!std::is_base_of_v<Serialize::ISerializable, Composition::Object>);
 
 TEST(CompositionChild, HasNoParentAtFirst)
 {
