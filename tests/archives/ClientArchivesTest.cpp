@@ -10,6 +10,7 @@
 #include "tests/shared/FieldVisitors.h"
 
 #include <EditorModel/persistence/ConstructionLog.h>
+#include <EditorModel/persistence/Fields.h>
 #include <EditorModel/persistence/Json.h>
 
 #include <boost/serialization/nvp.hpp>
@@ -18,6 +19,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <memory>
 #include <sstream>
 #include <vector>
@@ -58,7 +60,38 @@ struct Herbarium : Sample::Leaf
     }
 };
 
+/// Stores one of its texts in a form of its own, and does what the test wants while that is read.
+class Letter : public Serialize::ISerializable, public virtual PubSub::Object
+{
+    EDITORMODEL_PERSISTENT(Letter)
+
+    const Sample::Leaf* first = nullptr;
+    QString text;
+    const Sample::Leaf* second = nullptr;
+    const Sample::Tree* drawing = nullptr;
+    const Letter* reply = nullptr;
+
+    static std::function<void()> s_onReading;
+};
+
+std::function<void()> Letter::s_onReading;
+
+static void fields(Serialize::Fields& f, Letter& letter)
+{
+    const auto asItIs = [](const QString& text) { return text; };
+    const auto read = [](const QString& text) {
+        if (Letter::s_onReading)
+            Letter::s_onReading();
+        return text;
+    };
+    f("first", letter.first).coded("text", letter.text, asItIs, read)("second", letter.second);
+    f("drawing", letter.drawing)("reply", letter.reply);
+}
+
 } // namespace Client
+
+EDITORMODEL_ARCHIVE_NAME(Client::Letter, "Client::Letter")
+EDITORMODEL_PERSISTENT_CLASS(Client::Letter)
 
 namespace {
 
@@ -67,6 +100,9 @@ using Testing::Dump;
 
 struct BinaryForm
 {
+    /// A document that fails in the middle of an object.
+    static std::string cut(const std::string& text) { return text.substr(0, text.size() - 40); }
+
     template <class T>
     static std::string save(const T& value)
     {
@@ -86,6 +122,13 @@ struct BinaryForm
 
 struct XmlForm
 {
+    /// The last field has no number in it.
+    static std::string cut(std::string text)
+    {
+        const std::size_t at = text.rfind("<number>") + 8;
+        return text.replace(at, 1, "x");
+    }
+
     template <class T>
     static std::string save(const T& value)
     {
@@ -105,6 +148,13 @@ struct XmlForm
 
 struct JsonForm
 {
+    static std::string cut(const std::string& text)
+    {
+        auto root = nlohmann::json::parse(text);
+        root["content"].erase("inner");
+        return root.dump();
+    }
+
     template <class T>
     static std::string save(const T& value)
     {
@@ -221,6 +271,61 @@ TYPED_TEST(ClientArchives, AClassDerivedFromAPersistentOneKeepsItsOwnBody)
     TypeParam::load(TypeParam::save(herbarium), loaded);
     EXPECT_EQ(loaded.shelf, 3);
     EXPECT_EQ(loaded.number, 0);
+}
+
+TYPED_TEST(ClientArchives, AnArchiveMayBeReadWhileAnotherOneIs)
+{
+    const Sample::Leaf fern(4, QStringLiteral("fern"));
+    const Sample::Leaf moss(5, QStringLiteral("moss"));
+    Sample::Tree tree;
+    tree.whole = 7;
+    tree.leaf = &fern;
+    Client::Letter reply;
+    reply.text = QStringLiteral("Thanks");
+    reply.second = &moss;
+    Client::Letter letter;
+    letter.first = &fern;
+    letter.text = QStringLiteral("Dear reader");
+    letter.second = &moss;
+    letter.drawing = &tree;
+    letter.reply = &reply;
+    const Client::Letter* const content = &letter;
+    const std::string text = TypeParam::save(content);
+    const std::string inner = TypeParam::save(static_cast<const Sample::Tree*>(&tree));
+
+    // An inner archive that is read whole, one that ends too soon, and one more where that stood.
+    const Serialize::Details::ConstructionLog log;
+    int readings = 0;
+    Client::Letter::s_onReading = [&] {
+        ++readings;
+        Sample::Tree* loaded = nullptr;
+        TypeParam::load(inner, loaded);
+        EXPECT_EQ(Dump::of(*loaded), Dump::of(tree));
+        Sample::Tree* broken = nullptr;
+        EXPECT_ANY_THROW(TypeParam::load(TypeParam::cut(inner), broken));
+        TypeParam::load(inner, loaded);
+        EXPECT_EQ(Dump::of(*loaded), Dump::of(tree));
+    };
+    Client::Letter* loaded = nullptr;
+    TypeParam::load(text, loaded);
+    Client::Letter::s_onReading = nullptr;
+    EXPECT_EQ(readings, 2);
+    EXPECT_EQ(Dump::of(*loaded), Dump::of(letter));
+}
+
+TYPED_TEST(ClientArchives, AnArchiveIsReadAsAnyWhenOneBeforeItFailed)
+{
+    Sample::Tree tree;
+    tree.whole = 7;
+    tree.other = &tree;
+    const std::string text = TypeParam::save(tree);
+    for (int round = 0; round != 3; ++round) {
+        Sample::Tree broken;
+        EXPECT_ANY_THROW(TypeParam::load(TypeParam::cut(text), broken));
+        Sample::Tree loaded;
+        TypeParam::load(text, loaded);
+        EXPECT_EQ(Dump::of(loaded), Dump::of(tree));
+    }
 }
 
 TYPED_TEST(ClientArchives, AClassThatWasNeverRegisteredIsRefused)

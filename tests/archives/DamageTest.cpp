@@ -4,6 +4,8 @@
 #include "tests/archives/SampleClasses.h"
 #include "tests/shared/FieldVisitors.h"
 
+#include <EditorModel/media/ResourceTable.h>
+
 #include <gtest/gtest.h>
 
 #include <QCryptographicHash>
@@ -36,7 +38,9 @@ protected:
         m_grove.couple.second = &m_leaf;
         m_grove.notes[QStringLiteral("key")] = QStringLiteral("value");
         m_grove.list = {&m_leaf};
-        m_document = documentOf({&m_grove, &m_leaf}, GetParam());
+        m_table.resource2fileInfo[{QStringLiteral("film"), Resource::VideoType}].info.track = 2;
+        m_table.resource2fileInfo[{QStringLiteral("film"), Resource::AudioType}].info.track = 3;
+        m_document = documentOf({&m_grove, &m_leaf, &m_table}, GetParam());
     }
 
     /// True if the document was refused. Whatever is loaded must be whole enough to be walked and stored
@@ -69,6 +73,7 @@ protected:
     Sample::Leaf m_leaf;
     Sample::Tree m_tree;
     Sample::Grove m_grove;
+    ResourceTable::Object m_table;
     QByteArray m_document;
 };
 

@@ -211,6 +211,43 @@ TEST_F(ReentrancyTest, PublicationsOfOneObjectNestDeeply)
     EXPECT_THAT(heard, SizeIs(3 + 9 + 27 + 81 + 243));
 }
 
+/// The table of senders, the lists in it and the snapshots all move while they are in use.
+TEST_F(ReentrancyTest, ThousandsOfObjectsMayComeAndGoInHandlers)
+{
+    makeThree();
+    LampListener crowd(heard, "crowd");
+    std::deque<Lamp> lamps(3000);
+    std::deque<LampListener> ofOther;
+    for (int i = 0; i != 500; ++i) {
+        ofOther.emplace_back(heard, "other").subscribe(&other);
+    }
+    int turns = 0;
+    eachDoes([&] {
+        for (const Lamp& each : lamps) {
+            crowd.subscribe(&each);
+        }
+        publish(Lit(&lamps.back()));
+        // Once a publication to many has room it keeps it: only the first one makes the snapshots move.
+        publish(Lit(&other));
+        for (const Lamp& each : lamps) {
+            crowd.unsubscribe(&each);
+        }
+        publish(Lit(&lamps.back()));
+        ++turns;
+    });
+    publish(Lit(&lamp));
+    EXPECT_EQ(turns, 3);
+    Heard reached = take();
+    ASSERT_THAT(reached, SizeIs(3 * 502));
+    for (const std::size_t turn : {0, 502, 1004}) {
+        EXPECT_THAT(reached[turn], AnyOf("one", "two", "three"));
+        EXPECT_EQ(reached[turn + 1], "crowd");
+        EXPECT_THAT(Heard(reached.begin() + int(turn) + 2, reached.begin() + int(turn) + 502), Each("other"));
+    }
+    EXPECT_THAT(Heard({reached[0], reached[502], reached[1004]}),
+                UnorderedElementsAre("one", "two", "three"));
+}
+
 TEST_F(ReentrancyTest, WhoLeavesInANestedPublicationIsPassedOverInTheOuterOne)
 {
     makeThree();
