@@ -86,10 +86,11 @@ ValueRange rounded(const ValueRange& range, int atMost)
 std::vector<double> ticks(const ValueRange& range, int atMost)
 {
     const double step = tickStep(range.high - range.low, atMost);
+    const double first = std::ceil(range.low / step - 1e-9);
+    const auto count = static_cast<int>(std::floor(range.high / step + 1e-9) - first) + 1;
     std::vector<double> values;
-    const double last = std::floor(range.high / step + 1e-9);
-    for (double n = std::ceil(range.low / step - 1e-9); n <= last; ++n) {
-        values.push_back(n * step);
+    for (int n = 0; n < count; ++n) {
+        values.push_back((first + n) * step);
     }
     return values;
 }
