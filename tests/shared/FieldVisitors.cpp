@@ -143,11 +143,18 @@ void Dump::onPointer(const Serialize::Key& key, const Serialize::PointerField& f
         line(std::string(key.archive) + ": null");
         return;
     }
+    if (m_isOutline && m_pointersFollowed > 0) {
+        line(std::string(key.archive) + ": " + pointee.type->name);
+        return;
+    }
     const auto entered = m_numbers.emplace(std::make_pair(pointee.object, pointee.type),
                                            static_cast<int>(m_numbers.size()) + 1);
     line(std::string(key.archive) + ": " + pointee.type->name + " #" + std::to_string(entered.first->second));
-    if (entered.second)
-        nested(*pointee.type, pointee.object);
+    if (!entered.second)
+        return;
+    ++m_pointersFollowed;
+    nested(*pointee.type, pointee.object);
+    --m_pointersFollowed;
 }
 
 void Dump::onContainer(const Serialize::Key& key, const Serialize::Type& type, void* container)
@@ -158,13 +165,12 @@ void Dump::onContainer(const Serialize::Key& key, const Serialize::Type& type, v
     ++m_level;
     if (isOrderedByAddress(type)) {
         const int count = countOf(type, container);
+        ++m_indent;
         line(std::to_string(count) + " items");
+        --m_indent;
         std::vector<std::pair<std::string, int>> items;
-        for (int item = 1; item <= count; ++item) {
-            Dump alone(m_wrapTimes);
-            alone.onlyItem(item, type, container);
-            items.emplace_back(alone.text(), item);
-        }
+        for (int item = 1; item <= count && !m_isOutline; ++item)
+            items.emplace_back(outline(item, type, container), item);
         std::sort(items.begin(), items.end());
         for (const auto& item : items)
             onlyItem(item.second, type, container);
@@ -174,6 +180,14 @@ void Dump::onContainer(const Serialize::Key& key, const Serialize::Type& type, v
         m_item = outer;
     }
     --m_level;
+}
+
+std::string Dump::outline(int item, const Serialize::Type& type, void* container) const
+{
+    Dump alone(m_wrapTimes);
+    alone.m_isOutline = true;
+    alone.onlyItem(item, type, container);
+    return alone.text();
 }
 
 void Dump::onlyItem(int item, const Serialize::Type& type, void* container)

@@ -42,6 +42,9 @@ private:
     void onBinary(QByteArray& bytes, int size) override;
     std::shared_ptr<const Types::Image> onShare(const Types::Image*) override { return nullptr; }
 
+    /// What an item holds itself, its object included; pointers from there, which may lead back to the item,
+    /// and what is ordered by them are not followed.
+    std::string outline(int item, const Serialize::Type& type, void* container) const;
     void line(const std::string& text);
     void nested(const Serialize::Type& type, void* object);
     void onlyItem(int item, const Serialize::Type& type, void* container);
@@ -49,6 +52,8 @@ private:
 
     const bool m_wrapTimes;
     int m_indent = 0;
+    bool m_isOutline = false;
+    int m_pointersFollowed = 0;
     /// How many containers are open; items other than `m_item` of the container at `m_itemLevel` are passed
     /// over.
     int m_level = 0;
