@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "tests/shared/FieldTexts.h"
+
 #include <EditorModel/analysis/ClipSynchronization.h>
 
 #include <gmock/gmock.h>
@@ -14,7 +16,7 @@ using ClipSynchronization::Details::InputDataCheckNotification;
 using ClipSynchronization::Details::InputDataCheckRequest;
 using Clips = std::set<const Timeline::Clip*>;
 
-static_assert(std::is_base_of_v<PubSub::Object, ClipSynchronization::Object>);
+static_assert(Testing::isVirtualBase<PubSub::Object, ClipSynchronization::Object>);
 static_assert(std::is_base_of_v<Message::Types::Request<ClipSynchronization::Object>, InputDataCheckRequest>);
 static_assert(
     std::is_base_of_v<Message::Types::Notification<ClipSynchronization::Object>, InputDataCheckNotification>);

@@ -1,4 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "tests/shared/FieldTexts.h"
+
 #include <EditorModel/analysis/SceneDetection.h>
 #include <EditorModel/bus/View.h>
 #include <EditorModel/persistence/Serializable.h>
@@ -15,7 +17,7 @@ using SceneDetection::Range;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-static_assert(std::is_base_of_v<PubSub::Object, SceneDetection::Object>);
+static_assert(Testing::isVirtualBase<PubSub::Object, SceneDetection::Object>);
 static_assert(!std::is_base_of_v<Serialize::ISerializable, SceneDetection::Object>);
 static_assert(sizeof(Range) == 16);
 static_assert(sizeof(SceneDetection::State) == 4);
