@@ -403,7 +403,7 @@ TEST_F(ResourceKeeper, AnswersOtherThreadsWhileTablesChange)
             ++asked;
         }
     });
-    for (int i = 0; i != 200 || asked == 0; ++i) {
+    for (int i = 0; i < 200 || asked == 0; ++i) {
         client.change(&table)->resource2fileInfo[audio(wav)].info.duration = MTime(i);
     }
     isOver = true;
