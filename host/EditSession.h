@@ -41,6 +41,10 @@ struct Placement
     MTime duration = -1;
     /// If it is not null it goes onto the native audio track, below the clip, and is linked to it.
     const Timeline::Clip* nativeAudio = nullptr;
+
+    Placement() = default;
+    Placement(const Timeline::Clip* clip_, const Timeline::Track* track_, int level_ = 0,
+              MTime sourcePosition_ = 0, MTime duration_ = -1, const Timeline::Clip* nativeAudio_ = nullptr);
 };
 
 /// What becomes of the clips behind the one that changes its length.
@@ -74,7 +78,7 @@ enum class Ripple
 /// - Sound lies on audio tracks, and nothing else does; a track without a role takes anything.
 ///
 /// Requests from other modules to change the timeline are granted if they leave no fault; requests to remove
-/// it are refused. Moves must not be called from inside a callback about the timeline.
+/// it are refused.
 class EditSession : private Message::View<Timeline::Object>
 {
 public:
@@ -104,8 +108,8 @@ public:
     /// where it can't be.
     EditResult insert(const Placement& what, MTime at);
     /// What lies under it on the lane is trimmed, split or removed, with its native audio; leftovers shorter
-    /// than Clip::MIN_DURATION go too. A transition at an end that is cut off goes. Slaves of removed clips
-    /// stay and are slaves no more.
+    /// than Clip::MIN_DURATION go too. A transition or a fade at an end that is cut off goes. Slaves of
+    /// removed clips stay and are slaves no more.
     EditResult overwrite(const Placement& what, MTime at);
 
     // Removing. With the clip goes all that depends on it, and what leads to, from or between those.

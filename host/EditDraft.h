@@ -1,0 +1,113 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include <EditorModel/timeline/Timeline.h>
+
+#include <QString>
+
+#include <map>
+#include <memory>
+#include <set>
+#include <vector>
+
+namespace Host {
+
+/// Thrown by a step of an edit that cannot be taken. One sentence for people.
+struct EditRefused
+{
+    QString why;
+};
+
+/// A level of a track: clips on it follow one another.
+struct Lane
+{
+    const Timeline::Track* track;
+    int level;
+
+    bool holds(const Timeline::ClipTiming& timing) const
+    {
+        return timing.track == track && timing.trackLevel == level;
+    }
+};
+
+/// The timeline as an edit will leave it. The steps change what they say, and links, tracking links and
+/// transitions that name the same clips; finish() follows up on the rest.
+class EditDraft
+{
+public:
+    using Clips = std::set<const Timeline::Clip*>;
+
+    explicit EditDraft(const Timeline::Object& before);
+
+    Timeline::Object& timeline() { return m_timeline; }
+    const Timeline::Object& timeline() const { return m_timeline; }
+    Timeline::ClipTiming& timing(const Timeline::Clip* clip) { return m_timeline.clips.at(clip); }
+    /// Says that the clip has got another length or stretch, so that finish() looks after its ends.
+    void noteRetimed(const Timeline::Clip* clip) { m_retimed.push_back(clip); }
+
+    std::vector<const Timeline::Clip*> nativeAudioOf(const Timeline::Clip* master) const;
+    /// Those that start at `from` or behind.
+    Clips laterClips(const Lane& lane, MTime from) const;
+    /// The clips and all that depends on them. `fixed` is left out, and what comes in through it alone.
+    Clips withDependants(const Clips& clips, const Timeline::Clip* fixed = nullptr) const;
+
+    /// Refused where one of them may not be moved.
+    void shift(const Clips& clips, MTime delta);
+    /// Moves the later clips of the lane with what depends on them, all but `fixed`.
+    void ripple(const Lane& lane, MTime from, MTime delta, const Timeline::Clip* fixed = nullptr);
+
+    /// The offset is what the two are apart.
+    void link(const Timeline::Clip* master, const Timeline::Clip* slave);
+    void unlink(const Timeline::Clip* slave);
+    /// Takes the clip out with all that names it.
+    void erase(const Timeline::Clip* clip);
+    void eraseWithNativeAudio(const Timeline::Clip* clip);
+    /// Splits the clip, its native audio too, at a time within it. Returns the right part.
+    const Timeline::Clip* cut(const Timeline::Clip* clip, MTime at);
+    /// These let the end that is cut off go with its transition and its fade.
+    void cutHead(const Timeline::Clip* clip, MTime newStart);
+    void cutTail(const Timeline::Clip* clip, MTime newEnd);
+    /// Enters native audio for a clip that is there. Refused where there is nothing for it to play.
+    void addNativeAudio(const Timeline::Clip* master, const Timeline::Clip* audio);
+
+    /// Brings native audio, fades, transitions and the offsets of links after what was done.
+    void finish();
+    /// The clips that the draft has made, for whoever keeps the timeline.
+    std::vector<std::unique_ptr<Timeline::Clip>> takeMade() { return std::move(m_made); }
+
+private:
+    /// How a link's clips lay when its offset was right.
+    struct Apart
+    {
+        const Timeline::Clip* master;
+        MTime distance;
+    };
+
+    const Timeline::Clip* makeCopy(const Timeline::Clip* clip);
+    MTime distance(const Timeline::Clip* master, const Timeline::Clip* slave) const;
+    /// Gives the slave another master; the offset changes by as much as the masters lie apart.
+    void relink(const Timeline::Clip* slave, const Timeline::Clip* master);
+    const Timeline::Clip* cutAlone(const Timeline::Clip* clip, MTime at);
+    void handOverSlaves(const Timeline::Clip* left, const Timeline::Clip* right);
+    void handOverFollowers(const Timeline::Clip* left, const Timeline::Clip* right);
+
+    void retimeNativeAudio();
+    void limitFades();
+    void limitTransitions();
+    void limitTransition(const Transition::Object* transition);
+    void updateOffsets();
+
+    Timeline::Object m_timeline;
+    std::vector<const Timeline::Clip*> m_retimed;
+    std::map<const Timeline::Clip*, Apart> m_apart;
+    std::vector<std::unique_ptr<Timeline::Clip>> m_made;
+};
+
+/// How long a transition of the wished length, -1 for none, comes out on the pair: as long as is expected,
+/// but no longer than is available.
+MTime fittingLength(const Timeline::Object& timeline, const Transition::Object* transition,
+                    const Timeline::ClipPair& pair, MTime wish);
+/// The transitions at the clip's ends leave room for each other. True for null.
+bool hasRoomForTransitions(const Timeline::Object& timeline, const Timeline::Clip* clip);
+
+} // namespace Host
