@@ -29,7 +29,14 @@ AnalysisRunner::AnalysisRunner()
     processAddRequests();
 }
 
-AnalysisRunner::~AnalysisRunner() = default;
+AnalysisRunner::~AnalysisRunner()
+{
+    // Those who hear that the files are removed may have jobs removed: all of the runner must be there.
+    while (!m_files.empty()) {
+        retireFiles(m_files.begin()->first);
+        freeRetired();
+    }
+}
 
 void AnalysisRunner::run()
 {
@@ -38,6 +45,7 @@ void AnalysisRunner::run()
     }
     {
         const Restored<bool> running(m_isRunning, true);
+        const Restored<int> deeper(m_depth, m_depth + 1);
         while (const Job* const job = nextJob()) {
             process(job);
         }
@@ -52,12 +60,23 @@ const std::deque<MediaDescriber::Entry>& AnalysisRunner::entries(const FileAnaly
     return files == m_files.end() ? none : files->second->entries();
 }
 
+void AnalysisRunner::changeRequested(Job* job, Job* value)
+{
+    {
+        // An observer may start a run while others have yet to hear of the old value.
+        const Restored<int> deeper(m_depth, m_depth + 1);
+        JobView::changeRequested(job, value);
+    }
+    freeRetired();
+}
+
 void AnalysisRunner::removeRequested(Job* job)
 {
-    JobView::removeRequested(job);
-    if (!m_isRunning) {
-        freeRetired();
+    {
+        const Restored<int> deeper(m_depth, m_depth + 1);
+        JobView::removeRequested(job);
     }
+    freeRetired();
 }
 
 void AnalysisRunner::changed(const Job* job)
@@ -131,6 +150,9 @@ void AnalysisRunner::retireFiles(const Job* job)
 
 void AnalysisRunner::freeRetired()
 {
+    if (m_depth != 0) {
+        return;
+    }
     // Those who hear that the files are removed may retire others.
     std::deque<std::unique_ptr<MediaDescriber>> freed;
     freed.swap(m_retired);

@@ -23,7 +23,7 @@ namespace Host {
 /// beginning.
 ///
 /// The files in a job belong to the runner. They live until the job is started anew or removed, and then to
-/// the end of the request or the run in which that happens, or until the runner ends.
+/// the end of the outermost request or run in which that happens, or until the runner ends.
 class AnalysisRunner : private Message::View<FileAnalyzer::Object>
 {
 public:
@@ -43,6 +43,7 @@ private:
     using Job = FileAnalyzer::Object;
     using JobView = Message::View<Job>;
 
+    void changeRequested(Job* job, Job* value) override;
     void removeRequested(Job* job) override;
     using JobView::changed;
     void changed(const Job* job) override;
@@ -54,11 +55,14 @@ private:
     /// Other modules may do anything with the job while they are told of it.
     bool isGoingOn(const Job* job) const;
     void retireFiles(const Job* job);
+    /// Does nothing as long as a request or a run is going on.
     void freeRetired();
 
     std::deque<const Job*> m_queue;
     const Job* m_current = nullptr;
     bool m_isRunning = false;
+    /// The requests and runs that are going on, one within another.
+    int m_depth = 0;
     std::map<const Job*, std::unique_ptr<MediaDescriber>> m_files;
     /// No job has them any more, but a message that is still going round may.
     std::deque<std::unique_ptr<MediaDescriber>> m_retired;

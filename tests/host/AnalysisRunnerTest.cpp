@@ -13,6 +13,7 @@
 #include <csignal>
 #include <functional>
 #include <memory>
+#include <set>
 
 namespace {
 
@@ -37,6 +38,7 @@ public:
     using FileAnalyzer::View::fileAnalyzerAdd;
     using FileAnalyzer::View::fileAnalyzerChange;
     using FileAnalyzer::View::fileAnalyzerRemove;
+    using FileAnalyzer::View::fileAnalyzers;
 
     Job* add(Job& job, const QString& name, const QStringList& files)
     {
@@ -367,6 +369,108 @@ TEST_F(AnalysisRunner, FreesTheFilesOfAJobThatIsRemoved)
     EXPECT_THAT(any.enumerateAll(), IsEmpty());
     runner.run();
     EXPECT_THAT(runner.entries(&job), IsEmpty());
+}
+
+/// Looks at the files of the old value of each change, and calls something when a job is queued again.
+class OldValueReader : public Message::View<Job>
+{
+public:
+    OldValueReader(const Job* job, std::function<void()> whenQueued) : onQueued(std::move(whenQueued))
+    {
+        observe(job);
+    }
+
+    std::function<void()> onQueued;
+    std::size_t lost = 0;
+
+protected:
+    using Message::View<Job>::changed;
+    void changed(const Job* job, const Job* old) override
+    {
+        if (job->queued() && onQueued) {
+            std::exchange(onQueued, nullptr)();
+        }
+        const std::set<const Media::File*> shared = Message::View<Media::File>().enumerateAll();
+        for (const Media::File* file : old->opened) {
+            lost += shared.count(file) == 0 ? 1u : 0u;
+        }
+    }
+};
+
+TEST_F(AnalysisRunner, KeepsTheFilesOfTheOldValueWhileAChangeIsToldOf)
+{
+    Host::AnalysisRunner runner;
+    Client client;
+    client.add(job, "a", {wav, png});
+    runner.run();
+    // Whoever is told first starts the run; both read the old value afterwards.
+    OldValueReader first(&job, [] {});
+    OldValueReader second(&job, [] {});
+    const auto start = [&] {
+        first.onQueued = nullptr;
+        second.onQueued = nullptr;
+        runner.run();
+    };
+    first.onQueued = start;
+    second.onQueued = start;
+    client.fileAnalyzerChange(&job)->setStatus(FileAnalyzer::Queued)->setFiles({wav});
+    EXPECT_TRUE(job.processed());
+    EXPECT_EQ(first.lost + second.lost, 0u);
+    // Afterwards there are only those that the job has.
+    EXPECT_THAT(Message::View<Media::File>().enumerateAll(), SizeIs(1));
+}
+
+TEST_F(AnalysisRunner, KeepsTheFilesOfTheOldValueWhenTheJobIsRemovedMeanwhile)
+{
+    Host::AnalysisRunner runner;
+    Client client;
+    client.add(job, "a", {wav});
+    runner.run();
+    std::size_t shared = 0;
+    OldValueReader reader(&job, [&] {
+        client.fileAnalyzerRemove(&job);
+        shared = Message::View<Media::File>().enumerateAll().size();
+    });
+    client.fileAnalyzerChange(&job)->setStatus(FileAnalyzer::Queued);
+    EXPECT_EQ(shared, 1u);
+    EXPECT_EQ(reader.lost, 0u);
+    EXPECT_THAT(Message::View<Media::File>().enumerateAll(), IsEmpty());
+}
+
+/// Calls something, once, when a file is removed.
+class RemovalWatcher : public PubSub::Subscriber<Message::Types::Removed<Media::File>>
+{
+public:
+    explicit RemovalWatcher(std::function<void()> onRemoved) : m_onRemoved(std::move(onRemoved))
+    {
+        subscribeAll<Media::File>();
+    }
+    void notify(const Message::Types::Removed<Media::File>&) override
+    {
+        if (m_onRemoved) {
+            std::exchange(m_onRemoved, nullptr)();
+        }
+    }
+
+private:
+    std::function<void()> m_onRemoved;
+};
+
+TEST_F(AnalysisRunner, TakesRequestsWhileItEnds)
+{
+    auto runner = std::make_unique<Host::AnalysisRunner>();
+    Client client;
+    Job second;
+    client.add(job, "a", {wav, missing});
+    client.add(second, "b", {png});
+    runner->run();
+    const RemovalWatcher watcher([&] {
+        client.fileAnalyzerRemove(&job);
+        client.fileAnalyzerRemove(&second);
+    });
+    runner.reset();
+    EXPECT_THAT(client.fileAnalyzers(), IsEmpty());
+    EXPECT_THAT(Message::View<Media::File>().enumerateAll(), IsEmpty());
 }
 
 TEST_F(AnalysisRunner, LooksAtManyFilesIncludingSuchAsFail)
