@@ -9,15 +9,29 @@
 #include <QUuid>
 
 #include <algorithm>
+#include <iterator>
 #include <set>
 #include <utility>
 
 namespace Host {
 namespace {
 
+/// As the system walks it: ".." behind a link leads out of the folder that the link names.
 QString absolute(const QString& path)
 {
-    return QDir::cleanPath(QFileInfo(path).absoluteFilePath());
+    const QString whole = path.startsWith('/') ? path : QDir::currentPath() + '/' + path;
+    QString walked;
+    for (const QString& step : whole.split('/')) {
+        if (step == "..") {
+            const QFileInfo last(walked);
+            const QString target = last.isSymLink() ? last.canonicalFilePath() : QString();
+            walked = target.isEmpty() ? walked : target;
+            walked.truncate(std::max(0, walked.lastIndexOf('/')));
+        } else if (!step.isEmpty() && step != ".") {
+            walked += '/' + step;
+        }
+    }
+    return walked.isEmpty() ? QString("/") : walked;
 }
 
 /// The files that are open, whoever owns them, by their absolute paths.
@@ -42,6 +56,13 @@ void merge(const std::map<ResourceRef, ResourceTable::FileResourceInfo>& infos, 
 }
 
 } // namespace
+
+/// What is found out of files for one request.
+struct ResourceKeeper::Found
+{
+    std::map<ResourceRef, ResourceTable::FileResourceInfo> infos;
+    Compositions compositions;
+};
 
 ResourceKeeper::ResourceKeeper()
 {
@@ -85,12 +106,14 @@ void ResourceKeeper::notify(const ResourceTable::AddFilesToTableRequest& request
     if (!watches(table)) {
         return;
     }
-    const Infos infos = describe(table, QStringList(request.files));
+    const Found found = describe(table, QStringList(request.files));
     if (!isObserved(table)) {
         return;
     }
+    // Whoever hears of the change may ask at once.
+    remember(found.compositions);
     Table merged(*table);
-    merge(infos, merged);
+    merge(found.infos, merged);
     if (!(merged == *table)) {
         change(table)->resource2fileInfo = std::move(merged.resource2fileInfo);
     }
@@ -108,9 +131,9 @@ bool ResourceKeeper::watches(const Table* table)
     return true;
 }
 
-ResourceKeeper::Infos ResourceKeeper::describe(const Table* table, const QStringList& paths)
+ResourceKeeper::Found ResourceKeeper::describe(const Table* table, const QStringList& paths)
 {
-    Infos infos;
+    Found found;
     // Before anything is opened, which others hear of: they might close these.
     const std::map<QString, const Media::File*> open = openFiles();
     std::set<QString> done;
@@ -124,7 +147,7 @@ ResourceKeeper::Infos ResourceKeeper::describe(const Table* table, const QString
         if (known == open.end()) {
             closed << path;
         } else {
-            addTracks(*known->second, infos);
+            addTracks(*known->second, found);
         }
     }
     for (const QString& path : closed) {
@@ -135,32 +158,39 @@ ResourceKeeper::Infos ResourceKeeper::describe(const Table* table, const QString
             break;
         }
         if (entry.file.isOpened) {
-            addTracks(entry.file, infos);
+            addTracks(entry.file, found);
         } else {
             PubSub::publish(AddingFailed(table, path, entry.reason));
         }
     }
-    return infos;
+    return found;
 }
 
-void ResourceKeeper::addTracks(const Media::File& file, Infos& infos)
+void ResourceKeeper::addTracks(const Media::File& file, Found& found)
 {
     std::map<Resource::Type, int> counts;
     const auto add = [&](const Media::File::Track& track, Resource::Type type) {
         const ResourceRef resource(identifier(file.path, counts[type]++), type);
-        ResourceTable::FileResourceInfo& info = infos[resource];
+        ResourceTable::FileResourceInfo& info = found.infos[resource];
         info.info.path = absolute(file.path);
         info.info.track = track.index;
         info.info.duration = type == Resource::ImageType ? MTime() : file.length;
         info.timing.mode = type == Resource::ImageType ? Resource::Timing::Described : PlayedOnce;
-        const std::lock_guard lock(m_mutex);
-        m_compositions[resource] = file.composition;
+        found.compositions[resource] = file.composition;
     };
     for (const auto* track : file.videoTracks) {
         add(*track, track->isImage ? Resource::ImageType : Resource::VideoType);
     }
     for (const auto* track : file.audioTracks) {
         add(*track, Resource::AudioType);
+    }
+}
+
+void ResourceKeeper::remember(const Compositions& compositions)
+{
+    const std::lock_guard lock(m_mutex);
+    for (const auto& [resource, composition] : compositions) {
+        m_compositions[resource] = composition;
     }
 }
 
@@ -190,6 +220,16 @@ void ResourceKeeper::learn(const Table* departing)
         }
     }
     m_known.swap(known);
+    forgetCompositions();
+}
+
+/// The composition of what stands in no table any more may end.
+void ResourceKeeper::forgetCompositions()
+{
+    for (auto entry = m_compositions.begin(); entry != m_compositions.end();) {
+        const bool isKnown = m_known.find(entry->first) != m_known.end();
+        entry = isKnown ? std::next(entry) : m_compositions.erase(entry);
+    }
 }
 
 const ResourceTable::FileResourceInfo* ResourceKeeper::keep(const ResourceRef& resource,

@@ -186,6 +186,25 @@ TEST_F(ResourceKeeper, NamesATrackTheSameOnEveryRunAndOnEveryWayToIt)
     EXPECT_NE(Keeper::identifier("/a/b.mp4", 0), Keeper::identifier("/a/B.mp4", 0));
 }
 
+TEST_F(ResourceKeeper, GoesOutOfAFolderBehindALinkAsTheSystemDoes)
+{
+    const Keeper keeper;
+    const Folder folder;
+    ASSERT_TRUE(QDir(folder.path()).mkpath("far/deep"));
+    ASSERT_TRUE(QFile::link(folder.path("far/deep"), folder.path("link")));
+    folder.copy("picture.png", "a");
+    const QString far = folder.copy("speech.wav", "far/a");
+    EXPECT_EQ(Keeper::identifier(folder.path() + "/link/../a", 0), Keeper::identifier(far, 0));
+    EXPECT_EQ(Keeper::identifier("/../a", 0), Keeper::identifier("/a", 0));
+
+    Client client;
+    client.add(&table);
+    request(table, {folder.path("a"), folder.path() + "/link/../a"});
+    ASSERT_THAT(table.resource2fileInfo, SizeIs(2));
+    EXPECT_EQ(table.resource2fileInfo.at(image(folder.path("a"))).info.path, folder.path("a"));
+    EXPECT_EQ(table.resource2fileInfo.at(audio(far)).info.path, far);
+}
+
 TEST_F(ResourceKeeper, GivesIdentifiersThatTheTextFormCarries)
 {
     const ResourceRef resource = video("/a:b=c/%1%2.mp4", 3);
@@ -337,6 +356,26 @@ TEST_F(ResourceKeeper, NamesTheCompositionThatTheFileHadWhenItWasAdded)
     request(table, {"/composed.mp4"});
     EXPECT_EQ(Resource::Describer(video("/composed.mp4")).composition(), &composition);
     client.remove(&table);
+    EXPECT_EQ(Resource::Describer(video("/composed.mp4")).composition(), nullptr);
+}
+
+TEST_F(ResourceKeeper, ForgetsACompositionWithTheLastTableThatHasItsResource)
+{
+    const Keeper keeper;
+    auto composition = std::make_unique<Composition::Object>();
+    Media::File file;
+    Media::File::Track::Video track;
+    file.setPath("/composed.mp4")->setOpened(true)->setComposition(composition.get())->addTrack(&track);
+    opener.take(&file);
+    Client client;
+    client.add(&table);
+    request(table, {"/composed.mp4"});
+    Table stored = table;
+    client.remove(&table);
+    composition.reset();
+    // As after a project was closed and loaded again.
+    client.add(&stored);
+    EXPECT_NE(Resource::Describer(video("/composed.mp4")).fileInfo(), nullptr);
     EXPECT_EQ(Resource::Describer(video("/composed.mp4")).composition(), nullptr);
 }
 
