@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "CurveHeader.h"
 
-#include "CurveStyle.h"
+#include "PictureStyle.h"
 #include "MediaText.h"
 
 #include <QFontMetricsF>

@@ -21,6 +21,9 @@ void paint(const Picture& picture, QPaintDevice& device, double scale)
 QByteArray pngOf(const Picture& picture)
 {
     QImage image(picture.size() * pngScale, QImage::Format_RGB32);
+    if (image.isNull()) {
+        throw PictureError("cannot be written: the picture is too large");
+    }
     image.fill(Qt::white);
     paint(picture, image, pngScale);
     QBuffer buffer;

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "PoseScene.h"
 
-#include "CurveStyle.h"
+#include "PictureStyle.h"
 
 #include <QPainter>
 #include <QPainterPath>

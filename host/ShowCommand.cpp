@@ -4,6 +4,7 @@
 #include "MediaInput.h"
 #include "MediaTable.h"
 #include "ResourceText.h"
+#include "TimelineTable.h"
 
 #include <EditorModel/media/File.h>
 #include <EditorModel/media/ResourceTable.h>
@@ -28,12 +29,23 @@ std::deque<const T*> rootsOf(const Document::Graph& graph)
     return found;
 }
 
+void append(std::string& text, const std::string& part)
+{
+    text += (text.empty() ? "" : "\n") + part;
+}
+
 std::string textOf(const Document::Graph& graph)
 {
+    std::string text;
+    for (const Timeline::Object* timeline : rootsOf<Timeline::Object>(graph)) {
+        append(text, timelineTable(*timeline));
+    }
     const std::deque<const Media::File*> files = rootsOf<Media::File>(graph);
-    std::string text = files.empty() ? std::string() : mediaTable(files);
+    if (!files.empty()) {
+        append(text, mediaTable(files));
+    }
     for (const ResourceTable::Object* table : rootsOf<ResourceTable::Object>(graph)) {
-        text += (text.empty() ? "" : "\n") + resourceText(*table);
+        append(text, resourceText(*table));
     }
     return text;
 }
@@ -44,11 +56,11 @@ ExitCode show(const QString& path)
 {
     try {
         requireFile(path);
-        // What --save writes is read from anybody; nothing else needs to be.
+        // What the commands write is read from anybody; nothing else needs to be.
         const Document::Graph graph = Document::loadFile(path, Document::ForeignDocuments);
         const std::string text = textOf(graph);
         if (text.empty()) {
-            writeError(path, "holds neither descriptions of media files nor resources");
+            writeError(path, "holds no timeline, no descriptions of media files and no resources");
             return Failure;
         }
         return writeOutput(text) ? Success : Failure;

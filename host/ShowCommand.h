@@ -7,8 +7,8 @@
 
 namespace Host {
 
-/// Prints the media files and the resources of a document as they were when it was saved; the files
-/// themselves are not looked at.
+/// Prints the timelines, the media files and the resources of a document as they were when it was saved; the
+/// files themselves are not looked at.
 ExitCode show(const QString& path);
 
 } // namespace Host

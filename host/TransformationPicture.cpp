@@ -2,7 +2,7 @@
 #include "TransformationPicture.h"
 
 #include "CurveHeader.h"
-#include "CurveStyle.h"
+#include "PictureStyle.h"
 #include "MediaText.h"
 #include "PoseScene.h"
 

@@ -2,7 +2,7 @@
 #include "VolumePicture.h"
 
 #include "CurveHeader.h"
-#include "CurveStyle.h"
+#include "PictureStyle.h"
 
 #include <EditorModel/types/Decibel.h>
 

@@ -3,6 +3,7 @@
 #include "CurveCommand.h"
 #include "DisplayText.h"
 #include "MediaProbe.h"
+#include "PictureCommand.h"
 #include "ProbeCommand.h"
 #include "ShowCommand.h"
 
@@ -65,6 +66,10 @@ int refuse(const CLI::App& app, const CLI::ParseError& error)
 
 struct Arguments
 {
+    /// Of the command that was given.
+    Host::ExitCode (*run)(const Arguments&) = nullptr;
+    bool readsTimelines = false;
+
     std::vector<std::string> files;
     std::string document;
     bool json = false;
@@ -98,9 +103,29 @@ Host::ExitCode runCurve(const Arguments& arguments)
     return Host::curve(options);
 }
 
-CLI::App* addProbe(CLI::App& app, Arguments& arguments)
+Host::ExitCode runShow(const Arguments& arguments)
 {
-    CLI::App* const probe = app.add_subcommand("probe", "Describe media files");
+    return Host::show(fileName(arguments.document));
+}
+
+Host::ExitCode runPicture(const Arguments& arguments)
+{
+    return Host::drawTimeline(fileName(arguments.document), fileName(arguments.picture));
+}
+
+using Runner = Host::ExitCode (*)(const Arguments& arguments);
+
+CLI::App* addCommand(CLI::App& app, Arguments& arguments, const char* name, const char* description,
+                     Runner run)
+{
+    CLI::App* const command = app.add_subcommand(name, description);
+    command->callback([&arguments, run] { arguments.run = run; });
+    return command;
+}
+
+void addProbe(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const probe = addCommand(app, arguments, "probe", "Describe media files", runProbe);
     probe->add_option("FILE", arguments.files, "Video, sound or picture files")->required()->type_name("");
     probe
         ->add_option("--save", arguments.document,
@@ -109,19 +134,19 @@ CLI::App* addProbe(CLI::App& app, Arguments& arguments)
         ->check(checkDocumentName);
     probe->add_flag("--json", arguments.json, "Print JSON instead of a table");
     probe->add_flag("--verbose", arguments.verbose, "Let FFmpeg's libraries tell what they do");
-    return probe;
 }
 
-CLI::App* addShow(CLI::App& app, Arguments& arguments)
+void addShow(CLI::App& app, Arguments& arguments)
 {
-    CLI::App* const show = app.add_subcommand("show", "Show the descriptions in a document");
-    show->add_option("DOCUMENT", arguments.document, "A document that probe has saved")
+    CLI::App* const show = addCommand(app, arguments, "show", "Show what is in a document", runShow);
+    show->add_option("DOCUMENT", arguments.document,
+                     "A document with a timeline, or one that probe has saved")
         ->required()
         ->type_name("");
-    return show;
+    show->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
 }
 
-CLI::App* addCurve(CLI::App& app, Arguments& arguments)
+void addCurve(CLI::App& app, Arguments& arguments)
 {
     const std::map<std::string, Host::CurveSample> samples = {{"volume", Host::VolumeSample},
                                                               {"transformation", Host::TransformationSample}};
@@ -129,7 +154,7 @@ CLI::App* addCurve(CLI::App& app, Arguments& arguments)
     constexpr qint64 longest = 359999999;
     const CLI::Validator milliseconds = CLI::Range(qint64(0), longest).description("");
 
-    CLI::App* const curve = app.add_subcommand("curve", "Show how an envelope goes");
+    CLI::App* const curve = addCommand(app, arguments, "curve", "Show how an envelope goes", runCurve);
     curve->add_option("DOCUMENT", arguments.document, "A document with a volume or transformation envelope")
         ->required()
         ->type_name("");
@@ -156,7 +181,18 @@ CLI::App* addCurve(CLI::App& app, Arguments& arguments)
         ->transform(CLI::CheckedTransformer(samples, CLI::ignore_case).description(""));
     curve->add_flag("--own", arguments.curve.isOwn,
                     "Read binary and XML archives too, which must be of your own making");
-    return curve;
+}
+
+void addPicture(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const picture =
+        addCommand(app, arguments, "picture", "Draw the timeline of a project", runPicture);
+    picture->add_option("PROJECT", arguments.document, "A document with a timeline")
+        ->required()
+        ->type_name("");
+    picture->add_option("OUT", arguments.picture, "Where the picture goes: .png or .svg")
+        ->required()
+        ->type_name("");
 }
 
 void showGraveMessages(QtMsgType type, const QMessageLogContext&, const QString& message)
@@ -166,10 +202,10 @@ void showGraveMessages(QtMsgType type, const QMessageLogContext&, const QString&
     }
 }
 
-/// Pictures need fonts, and those a platform; it has no windows, so that it needs no screen.
-std::unique_ptr<QCoreApplication> makeApplication(bool draws, int& argc, char** argv)
+/// Pictures, drawn or in a document, need a platform; it has no windows, so that it needs no screen.
+std::unique_ptr<QCoreApplication> makeApplication(bool hasPictures, int& argc, char** argv)
 {
-    if (!draws) {
+    if (!hasPictures) {
         return std::make_unique<QCoreApplication>(argc, argv);
     }
     qputenv("QT_QPA_PLATFORM", "offscreen");
@@ -187,24 +223,23 @@ int main(int argc, char** argv)
     useUtf8();
 
     Arguments arguments;
-    CLI::App app("Describes media files, shows what was saved of them, and draws envelopes.", "editormodel");
+    CLI::App app("Describes media files, edits and draws timelines, and draws envelopes.", "editormodel");
     app.require_subcommand(1);
     app.failure_message(usageMessage);
-    const CLI::App* const probe = addProbe(app, arguments);
-    const CLI::App* const show = addShow(app, arguments);
-    const CLI::App* const curve = addCurve(app, arguments);
+    addProbe(app, arguments);
+    addShow(app, arguments);
+    addCurve(app, arguments);
+    addPicture(app, arguments);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
         return refuse(app, error) == 0 ? Host::Success : Host::UsageError;
     }
 
-    const auto application = makeApplication(curve->parsed() && !arguments.picture.empty(), argc, argv);
+    const auto application =
+        makeApplication(arguments.readsTimelines || !arguments.picture.empty(), argc, argv);
     try {
-        if (probe->parsed()) {
-            return runProbe(arguments);
-        }
-        return show->parsed() ? Host::show(fileName(arguments.document)) : runCurve(arguments);
+        return arguments.run(arguments);
     } catch (const std::bad_alloc&) {
         Host::writeError(QStringLiteral("there is not enough memory"));
     } catch (const std::exception& error) {

@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "Command.h"
 #include "Samples.h"
 
 #include <EditorModel/effects/Envelope.h>
@@ -7,8 +8,6 @@
 #include <EditorModel/persistence/Document.h>
 
 #include <QImage>
-#include <QProcess>
-#include <QProcessEnvironment>
 #include <QStringList>
 
 #include <gmock/gmock.h>
@@ -26,41 +25,6 @@ using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::Not;
 using testing::StartsWith;
-
-struct Outcome
-{
-    int exitCode;
-    std::string output;
-    std::string errors;
-};
-
-Outcome run(const QString& program, const QStringList& arguments, const QString& folder = QString(),
-            const QString& locale = "C.UTF-8")
-{
-    QProcess process;
-    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
-    environment.insert("LC_ALL", locale);
-    process.setProcessEnvironment(environment);
-    process.setWorkingDirectory(folder);
-    process.start(program, arguments);
-    if (!process.waitForFinished(60000) || process.exitStatus() != QProcess::NormalExit) {
-        throw std::runtime_error("the command did not end by itself");
-    }
-    return {process.exitCode(), process.readAllStandardOutput().toStdString(),
-            process.readAllStandardError().toStdString()};
-}
-
-Outcome editormodel(const QStringList& arguments, const QString& folder = QString(),
-                    const QString& locale = "C.UTF-8")
-{
-    return run(EDITORMODEL_COMMAND, arguments, folder, locale);
-}
-
-/// Everything on this test's line may depend on what an encoder makes, but for these words in this order.
-testing::Matcher<std::string> hasLine(const QStringList& words)
-{
-    return testing::ContainsRegex(("(^|\n) *" + words.join("  +") + "[^\n]*\n").toStdString());
-}
 
 TEST(ProbeCommand, PrintsATableOfTheFilesAndTheirTracks)
 {
@@ -280,7 +244,8 @@ TEST_P(SavedEnvelopes, AreNoDescriptions)
     ASSERT_EQ(editormodel({"curve", "--sample", "volume", document}).exitCode, 0);
     const Outcome shown = editormodel({"show", document});
     EXPECT_EQ(shown.exitCode, 1);
-    EXPECT_THAT(shown.errors, HasSubstr("holds neither descriptions of media files nor resources"));
+    EXPECT_THAT(shown.errors,
+                HasSubstr("holds no timeline, no descriptions of media files and no resources"));
 }
 
 TEST_P(SavedEnvelopes, AreReadInEveryForm)

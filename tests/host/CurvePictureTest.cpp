@@ -1,14 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "Pictures.h"
 #include "Samples.h"
 
-#include "host/CurveStyle.h"
 #include "host/Picture.h"
+#include "host/PictureStyle.h"
 #include "host/TransformationPicture.h"
 #include "host/VolumePicture.h"
 
-#include <QImage>
 #include <QTransform>
-#include <QXmlStreamReader>
 
 #include <gmock/gmock.h>
 
@@ -21,36 +20,6 @@ using namespace HostTests;
 
 constexpr double nan = std::numeric_limits<double>::quiet_NaN();
 constexpr double inf = std::numeric_limits<double>::infinity();
-
-/// A picture as the PNG file that is written of it.
-class Drawing
-{
-public:
-    explicit Drawing(const Host::Picture& picture)
-    {
-        const QString path = m_folder.path("picture.png");
-        Host::savePicture(picture, path, Host::Png);
-        image = QImage(path);
-    }
-
-    QColor at(QPointF place) const { return image.pixelColor((place * Host::pngScale).toPoint()); }
-
-    QImage image;
-
-private:
-    const Folder m_folder;
-};
-
-bool isNear(const QColor& a, const QColor& b)
-{
-    return std::abs(a.red() - b.red()) < 12 && std::abs(a.green() - b.green()) < 12 &&
-           std::abs(a.blue() - b.blue()) < 12;
-}
-
-std::string nameOf(const QColor& colour)
-{
-    return colour.name().toStdString();
-}
 
 VolumeEnvelope hill()
 {
@@ -222,36 +191,6 @@ TEST(TransformationPicture, WithstandsWhatNoEnvelopeShouldHold)
         const Host::TransformationPicture picture(Host::TransformationCurve(odd, 10));
         EXPECT_FALSE(Drawing(picture).image.isNull());
     }
-}
-
-struct Svg
-{
-    QString error;
-    QString width;
-    QString viewBox;
-    QStringList texts;
-    int lines = 0;
-};
-
-Svg readSvg(const QString& path)
-{
-    Svg svg;
-    QXmlStreamReader reader(contentOf(path));
-    while (!reader.atEnd()) {
-        if (reader.readNext() != QXmlStreamReader::StartElement) {
-            continue;
-        }
-        if (reader.name() == QLatin1String("svg")) {
-            svg.width = reader.attributes().value("width").toString();
-            svg.viewBox = reader.attributes().value("viewBox").toString();
-        } else if (reader.name() == QLatin1String("polyline")) {
-            ++svg.lines;
-        } else if (reader.name() == QLatin1String("text")) {
-            svg.texts << reader.readElementText().trimmed();
-        }
-    }
-    svg.error = reader.errorString();
-    return svg;
 }
 
 TEST(SavedPicture, IsAWellFormedDrawingOfVectors)

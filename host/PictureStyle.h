@@ -4,7 +4,7 @@
 #include <QColor>
 #include <QFont>
 
-/// How curves look.
+/// What the pictures have in common in their looks.
 namespace Host::Style {
 
 inline const QColor paper(255, 255, 255);
