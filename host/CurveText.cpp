@@ -9,6 +9,8 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
+#include <utility>
 
 namespace Host {
 namespace {
@@ -183,6 +185,19 @@ void addPose(Table& table, std::vector<std::string> firstCells, const Pose& pose
     table.addRow(firstCells);
 }
 
+/// The lowest and the highest of the values that are numbers.
+std::optional<std::pair<double, double>> extent(const std::vector<double>& values)
+{
+    std::optional<std::pair<double, double>> found;
+    for (const double value : values) {
+        if (!std::isnan(value)) {
+            found = found ? std::pair(std::min(found->first, value), std::max(found->second, value))
+                          : std::pair(value, value);
+        }
+    }
+    return found;
+}
+
 std::string posePlots(const TransformationCurve& curve, int columns)
 {
     Table table({Table::Left, Table::Left, Table::Right, Table::Left});
@@ -193,9 +208,10 @@ std::string posePlots(const TransformationCurve& curve, int columns)
         if (part.turns) {
             values = unwrapped(values);
         }
-        const ValueRange covered = rangeOf(values, 0.0);
-        table.addRow({part.name, linePlot(values, rangeOf(values, part.least)), part.text(covered.low),
-                      " " + part.text(covered.high)});
+        const auto covered = extent(values);
+        table.addRow({part.name, linePlot(values, rangeOf(values, part.least)),
+                      covered ? part.text(covered->first) : "-",
+                      " " + (covered ? part.text(covered->second) : "-")});
     }
     return joined(table.lines());
 }

@@ -261,4 +261,20 @@ TEST(TransformationText, ShowsEveryPartOfThePose)
               "00:00:00.700   0.7  -1.4    200 %    100 %      270°     30 %\n");
 }
 
+TEST(TransformationText, TellsTheLowestAndTheHighestValueAsTheyAre)
+{
+    const auto linesOf = [](double dx, double dy) {
+        TransformationEnvelope envelope;
+        envelope.addKeyValue(0.0, Transformation::Object(QTransform::fromTranslate(dx, dy), 100));
+        Host::CurveTextSize size;
+        size.columns = 1;
+        return Host::transformationText({envelope, 1000}, size);
+    };
+    // What the plot makes wider so that there is something to see is not what the values are.
+    EXPECT_THAT(linesOf(1e6, 1e13), testing::ContainsRegex("\ndx +[^ ]+ +1000000   1000000\n"));
+    EXPECT_THAT(linesOf(1e6, 1e13), testing::ContainsRegex("\ndy +[^ ]+ +1e\\+13   1e\\+13\n"));
+    EXPECT_THAT(linesOf(-inf, nan), testing::ContainsRegex("\ndx +[^ ]+ +-inf   -inf\n"));
+    EXPECT_THAT(linesOf(-inf, nan), testing::ContainsRegex("\ndy +[^ ]+ +-   -\n"));
+}
+
 } // namespace
