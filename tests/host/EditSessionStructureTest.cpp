@@ -1,0 +1,258 @@
+// SPDX-License-Identifier: Apache-2.0
+// What an edit session does to transitions, tracks and links, and how it shares its timeline.
+#include "EditFixture.h"
+
+#include <memory>
+
+namespace {
+
+using namespace EditTests;
+using testing::ElementsAre;
+using testing::IsEmpty;
+using testing::Pair;
+
+/// Three clips in a row on the primary track.
+class EditSessionStructure : public EditFixture
+{
+protected:
+    EditSessionStructure()
+    {
+        lay(a, primary, 0, 1000);
+        lay(b, primary, 1000, 2000);
+        lay(c, primary, 3000, 1000);
+    }
+
+    Clip* a = picture("a");
+    Clip* b = picture("b");
+    Clip* c = picture("c");
+    Clip* x = picture("x");
+};
+
+// Transitions
+
+TEST_F(EditSessionStructure, ATransitionTakesHalfOfItsLengthFromEitherClip)
+{
+    const Transition::Object* const t = transition();
+    done(session.addTransition(t, {a, b}, 601));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 >300, b 1000-3000 @0 <300, c 3000-4000 @0");
+    EXPECT_THAT(now().transitions, ElementsAre(Pair(t, Pair(a, b))));
+}
+
+TEST_F(EditSessionStructure, WithoutAWishATransitionHasItsDefaultLengthOrWhatIsAvailable)
+{
+    // 2000 by default: 1000 from each, which is all of a.
+    done(session.addTransition(transition(), {a, b}));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 >1000, b 1000-3000 @0 <1000, c 3000-4000 @0");
+    // Half of the default is 1000, but 10 are left to the other end.
+    done(session.addTransition(transition(), {c, nullptr}));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 >1000, b 1000-3000 @0 <1000, c 3000-4000 @0 >990");
+}
+
+TEST_F(EditSessionStructure, ATransitionKeepsItsDistanceFromTheOneAtTheOtherEnd)
+{
+    done(session.addTransition(transition(), {nullptr, a}, 200));
+    // 1000 - (200 + 10)
+    done(session.addTransition(transition(), {a, b}));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 <200 >790, b 1000-3000 @0 <790, c 3000-4000 @0");
+}
+
+TEST_F(EditSessionStructure, ATransitionThatHasNoRoomIsRefused)
+{
+    done(session.addTransition(transition(), {a, b}));
+    refused(session.addTransition(transition(), {nullptr, a}), {"\"a\"", "\"dissolve\"", "00:00:01.000"});
+}
+
+TEST_F(EditSessionStructure, ATransitionReplacesThoseThatAreInItsWay)
+{
+    const Transition::Object* const t = transition();
+    done(session.addTransition(transition(), {a, b}, 600));
+    done(session.addTransition(t, {a, nullptr}, 250));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 >250, b 1000-3000 @0, c 3000-4000 @0");
+    EXPECT_THAT(now().transitions, ElementsAre(Pair(t, Pair(a, nullptr))));
+}
+
+TEST_F(EditSessionStructure, ATransitionMayBeGivenAnotherLength)
+{
+    const Transition::Object* const t = transition();
+    done(session.addTransition(t, {a, b}, 600));
+    done(session.addTransition(t, {a, b}, 400));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 >200, b 1000-3000 @0 <200, c 3000-4000 @0");
+    // Without a wish it keeps the one that it has.
+    done(session.addTransition(t, {a, b}));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 >200, b 1000-3000 @0 <200, c 3000-4000 @0");
+}
+
+TEST_F(EditSessionStructure, ATransitionIsRefusedOnClipsThatDoNotFollowOneAnother)
+{
+    const Transition::Object* const t = transition();
+    refused(session.addTransition(t, {a, c}), {"\"c\"", "\"a\"", "00:00:03.000", "00:00:01.000"});
+    refused(session.addTransition(t, {b, a}), {"\"a\"", "\"b\""});
+    refused(session.addTransition(t, {a, a}), {"different"});
+    refused(session.addTransition(t, {nullptr, nullptr}), {"clip"});
+    refused(session.addTransition(t, {x, nullptr}), {"\"x\"", "not on the timeline"});
+    refused(session.addTransition(nullptr, {a, b}), {"no transition"});
+    refused(session.addTransition(t, {a, b}, -2), {"\"dissolve\"", "-00:00:00.002"});
+    done(session.addTransition(t, {a, b}, 600));
+    refused(session.addTransition(t, {b, c}), {"\"dissolve\"", "already", "00:00:00.700"});
+}
+
+TEST_F(EditSessionStructure, RemovingATransitionGivesItsSharesBack)
+{
+    const Transition::Object* const t = transition();
+    done(session.addTransition(t, {a, b}, 600));
+    done(session.removeTransition(t));
+    EXPECT_EQ(row(primary), "a 0-1000 @0, b 1000-3000 @0, c 3000-4000 @0");
+    refused(session.removeTransition(t), {"not on the timeline"});
+    refused(session.removeTransition(nullptr), {"not on the timeline"});
+}
+
+// Tracks
+
+TEST_F(EditSessionStructure, ATrackTakesThePlaceOfAnotherOfItsType)
+{
+    Track* const second = session.makeTrack(ExtraVideoTrack);
+    Track* const third = session.makeTrack(ExtraVideoTrack);
+    done(session.addTrack(second));
+    done(session.addTrack(third));
+    done(session.moveTrack(extra, third));
+    EXPECT_THAT(now().tracks, ElementsAre(primary, native, audio, title, second, third, extra));
+    done(session.moveTrack(third, second));
+    EXPECT_THAT(now().tracks, ElementsAre(primary, native, audio, title, third, second, extra));
+    refused(session.moveTrack(extra, primary), {"type"});
+    refused(session.moveTrack(extra, extra), {"another"});
+    refused(session.moveTrack(nullptr, extra), {"not on the timeline"});
+    refused(session.moveTrack(extra, session.makeTrack(ExtraVideoTrack)), {"not on the timeline"});
+}
+
+TEST_F(EditSessionStructure, ATrackIsAddedOnceAndToItsOwnTimeline)
+{
+    refused(session.addTrack(nullptr), {"no new track"});
+    refused(session.addTrack(extra), {"no new track"});
+    Track foreign(AudioTrack);
+    refused(session.addTrack(&foreign), {"another timeline"});
+}
+
+TEST_F(EditSessionStructure, ATrackIsRemovedWithItsClipsAndWhatDependsOnThem)
+{
+    Clip* const s = overlay("s");
+    Clip* const t = overlay("t");
+    lay(s, title, 1200, 500);
+    lay(t, title, 5000, 500);
+    done(session.link(b, s));
+    done(session.append({x, primary, 0, 0, 1000, sound("xn")}));
+    done(session.addTransition(transition(), {a, b}, 600));
+    done(session.removeTrack(primary));
+    EXPECT_THAT(now().tracks, ElementsAre(extra, native, audio, title));
+    EXPECT_EQ(row(native), "");
+    EXPECT_EQ(row(title), "t 5000-5500 @0");
+    EXPECT_THAT(now().transitions, IsEmpty());
+    EXPECT_THAT(links(), IsEmpty());
+    refused(session.removeTrack(primary), {"not on the timeline"});
+    refused(session.append({picture("y"), primary}), {"not on the timeline"});
+}
+
+// Links
+
+TEST_F(EditSessionStructure, ALinkNotesHowFarTheTwoAreApart)
+{
+    Clip* const s = overlay("s");
+    lay(s, title, 1200, 500);
+    done(session.link(b, s));
+    EXPECT_THAT(links(), ElementsAre("s(1200)>b(1000)+200"));
+    done(session.link(c, s));
+    EXPECT_THAT(links(), ElementsAre("s(1200)>c(3000)+-1800"));
+    done(session.unlink(s));
+    EXPECT_THAT(links(), IsEmpty());
+    refused(session.unlink(s), {"\"s\"", "00:00:01.200"});
+}
+
+TEST_F(EditSessionStructure, ALinkInACircleIsRefused)
+{
+    done(session.link(a, b));
+    done(session.link(b, c));
+    refused(session.link(c, a), {"\"a\"", "\"c\"", "00:00:00.000"});
+    refused(session.link(a, a), {"\"a\""});
+    refused(session.link(a, x), {"\"x\"", "not on the timeline"});
+    refused(session.link(x, a), {"\"x\"", "not on the timeline"});
+    refused(session.link(nullptr, a), {"no clip"});
+    refused(session.link(a, nullptr), {"no clip"});
+}
+
+TEST_F(EditSessionStructure, TheOffsetOfAForeignLinkChangesByWhatTheClipsMove)
+{
+    // Whoever made the link counts its offset from somewhere else.
+    Clip* const s = overlay("s");
+    lay(s, title, 3200, 500);
+    watcher.change(session.timeline())->addLink(c, s, 5);
+    EXPECT_THAT(links(), ElementsAre("s(3200)>c(3000)+5"));
+    EXPECT_TRUE(session.move(s, 3300));
+    EXPECT_TRUE(session.move(c, 4000));
+    EXPECT_THAT(links(), ElementsAre("s(4300)>c(4000)+105"));
+}
+
+// Sharing
+
+TEST_F(EditSessionStructure, RequestsOfOthersAreGrantedWhereTheyLeaveNoFault)
+{
+    watcher.change(session.timeline())->moveClip(c, 5000);
+    EXPECT_EQ(row(primary), "a 0-1000 @0, b 1000-3000 @0, c 5000-6000 @0");
+    EXPECT_EQ(watcher.changes, 1);
+    watcher.change(session.timeline())->moveClip(c, 2000);
+    watcher.change(session.timeline())->removeTrack(primary);
+    EXPECT_EQ(row(primary), "a 0-1000 @0, b 1000-3000 @0, c 5000-6000 @0");
+    EXPECT_EQ(watcher.changes, 1);
+}
+
+TEST_F(EditSessionStructure, ATimelineIsNotTakenFromItsSession)
+{
+    watcher.remove(session.timeline());
+    EXPECT_FALSE(watcher.isRemoved);
+    EXPECT_TRUE(session.lift(a));
+    EXPECT_EQ(watcher.changes, 1);
+}
+
+TEST(EditSession, OthersHearOfTheTimelinesEnd)
+{
+    auto session = std::make_unique<EditSession>();
+    Watcher watcher(session->timeline());
+    EXPECT_FALSE(watcher.isRemoved);
+    session.reset();
+    EXPECT_TRUE(watcher.isRemoved);
+}
+
+TEST(EditSession, EditsATimelineOfTheCaller)
+{
+    Timeline::Object timeline;
+    Track track(PrimaryTrack);
+    track.setTimeline(&timeline);
+    Clip clip;
+    clip.setSourceDuration(5000);
+    timeline.addTrack(&track)->addClip(&clip, ClipTiming(&track, 0, 0, 3000, 0, 5000));
+    {
+        EditSession session(&timeline);
+        EXPECT_EQ(session.timeline(), &timeline);
+        EXPECT_TRUE(session.trimRight(&clip, 1000));
+    }
+    EXPECT_EQ(timeline.clipTiming(&clip).duration, MTime(2000));
+}
+
+TEST(EditSession, ATimelineWithAFaultIsNotEditedUntilSomebodyMendsIt)
+{
+    Timeline::Object timeline;
+    Track track(PrimaryTrack);
+    track.setTimeline(&timeline);
+    Clip clip;
+    clip.setName("late")->setSourceDuration(5000);
+    timeline.addTrack(&track)->addClip(&clip, ClipTiming(&track, 0, 0, 6000, 0, 5000));
+    EditSession session(&timeline);
+    Watcher watcher(&timeline);
+    const EditResult result = session.lift(&clip);
+    EXPECT_THAT(result.refusal.toStdString(), testing::HasSubstr("\"late\""));
+    EXPECT_EQ(watcher.changes, 0);
+    watcher.change(&timeline)->setClipDuration(&clip, 5000);
+    EXPECT_TRUE(session.lift(&clip));
+    EXPECT_EQ(watcher.changes, 2);
+    EXPECT_THAT(timeline.clips, IsEmpty());
+}
+
+} // namespace
