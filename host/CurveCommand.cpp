@@ -38,22 +38,18 @@ void writeSample(const CurveOptions& options)
     Document::saveFile(options.document, {root}, *form, Document::Stream);
 }
 
-template <class T>
-const T* firstOf(const Document::Graph& graph)
-{
-    for (const Serialize::ISerializable* root : graph.roots()) {
-        if (const auto* const found = dynamic_cast<const T*>(root)) {
-            return found;
-        }
-    }
-    return nullptr;
-}
-
 [[noreturn]] void refuseContent(const CurveOptions& options, const Document::Graph& graph)
 {
     const Serialize::ISerializable* const root = graph.rootAs<Serialize::ISerializable>();
     const QString content = root ? QString::fromStdString(root->GetNameInArchive()) : "nothing";
     throw Refusal{options.document, "holds neither a volume nor a transformation envelope, but " + content};
+}
+
+CurveTextSize textSize(const CurveOptions& options)
+{
+    CurveTextSize size;
+    size.steps = options.steps;
+    return size;
 }
 
 /// The text goes out before the picture, and whether or not that can be written.
@@ -67,25 +63,37 @@ bool present(const CurveOptions& options, const std::optional<PictureForm>& form
     return isPrinted;
 }
 
+bool showVolume(const VolumeEnvelope& envelope, const CurveOptions& options,
+                const std::optional<PictureForm>& form)
+{
+    const VolumeCurve found(envelope, options.span);
+    const auto picture = form ? std::make_unique<VolumePicture>(found) : nullptr;
+    return present(options, form, volumeText(found, textSize(options)), picture.get());
+}
+
+bool showTransformation(const TransformationEnvelope& envelope, const CurveOptions& options,
+                        const std::optional<PictureForm>& form)
+{
+    if (options.span.hasFades()) {
+        throw Refusal{options.document, "holds a transformation envelope, which takes no fades"};
+    }
+    const TransformationCurve found(envelope, options.span.length);
+    const auto picture = form ? std::make_unique<TransformationPicture>(found) : nullptr;
+    return present(options, form, transformationText(found, textSize(options)), picture.get());
+}
+
 bool showCurve(const CurveOptions& options, const std::optional<PictureForm>& form)
 {
     requireFile(options.document);
     const Document::Graph graph = Document::loadFile(
         options.document, options.isOwn ? Document::OwnDocuments : Document::ForeignDocuments);
-    CurveTextSize size;
-    size.steps = options.steps;
-    if (const auto* const volume = firstOf<VolumeEnvelope>(graph)) {
-        const VolumeCurve found(*volume, options.span);
-        const auto picture = form ? std::make_unique<VolumePicture>(found) : nullptr;
-        return present(options, form, volumeText(found, size), picture.get());
-    }
-    if (const auto* const transformation = firstOf<TransformationEnvelope>(graph)) {
-        if (options.span.hasFades()) {
-            throw Refusal{options.document, "holds a transformation envelope, which takes no fades"};
+    for (const Serialize::ISerializable* root : graph.roots()) {
+        if (const auto* const volume = dynamic_cast<const VolumeEnvelope*>(root)) {
+            return showVolume(*volume, options, form);
         }
-        const TransformationCurve found(*transformation, options.span.length);
-        const auto picture = form ? std::make_unique<TransformationPicture>(found) : nullptr;
-        return present(options, form, transformationText(found, size), picture.get());
+        if (const auto* const transformation = dynamic_cast<const TransformationEnvelope*>(root)) {
+            return showTransformation(*transformation, options, form);
+        }
     }
     refuseContent(options, graph);
 }

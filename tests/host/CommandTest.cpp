@@ -346,6 +346,21 @@ TEST(CurveCommand, DrawsPicturesOfBothEnvelopes)
     EXPECT_TRUE(contentOf(folder.path("t.svg")).contains("<svg "));
 }
 
+TEST(CurveCommand, ShowsTheFirstEnvelopeWhicheverItIs)
+{
+    const Folder folder;
+    const Media::File file;
+    VolumeEnvelope volume;
+    const TransformationEnvelope transformation;
+    Document::saveFile(folder.path("a.json"), {nullptr, &file, &transformation, &volume}, Document::Json,
+                       Document::Stream);
+    EXPECT_THAT(editormodel({"curve", "a.json"}, folder.path()).output,
+                StartsWith("Transformation envelope"));
+    Document::saveFile(folder.path("b.json"), {&file, &volume, &transformation}, Document::Json,
+                       Document::Stream);
+    EXPECT_THAT(editormodel({"curve", "b.json"}, folder.path()).output, StartsWith("Volume envelope"));
+}
+
 TEST(CurveCommand, TellsInOneLineWhatIsWrong)
 {
     const Folder folder;
