@@ -127,6 +127,14 @@ TEST_F(EditSessionMove, OverwritingTakesTransitionsAndFadesOfTheEndsThatItCutsOf
     EXPECT_EQ(now().transitions.size(), 2u);
 }
 
+TEST_F(EditSessionMove, OverwritingLeavesClipsThatItOnlyTouchesAsTheyAre)
+{
+    done(session.setFades(a, 0, 100));
+    done(session.addTransition(transition(), {nullptr, c}, 200));
+    done(session.overwrite({x, primary, 0, 0, 2000}, 1000));
+    EXPECT_EQ(row(primary), "a 0-1000 @0 \\100, x 1000-3000 @0, c 3000-4000 @0 <200");
+}
+
 TEST_F(EditSessionMove, OverwritingTakesLeftoversThatAreTooShort)
 {
     // 5 ms would be left of a clip on either side.
@@ -146,6 +154,14 @@ TEST_F(EditSessionMove, OverwritingRemovesTheNativeAudioOfWhatLiesUnder)
                             "x 4250-4750 @100, d 4750-5000 @750");
     EXPECT_EQ(row(native), "dn 4000-4250 @0, xn 4250-4750 @100, dn 4750-5000 @750");
     EXPECT_THAT(links(), ElementsAre("dn(4000)>d(4000)+0", "dn(4750)>d(4750)+0", "xn(4250)>x(4250)+0"));
+}
+
+TEST_F(EditSessionMove, OverwritingAWholeClipRemovesItsNativeAudio)
+{
+    done(session.append({picture("d"), primary, 0, 0, 1000, sound("dn")}));
+    done(session.overwrite({x, primary, 0, 0, 1000}, 4000));
+    EXPECT_EQ(row(primary), "a 0-1000 @0, b 1000-3000 @0, c 3000-4000 @0, x 4000-5000 @0");
+    EXPECT_EQ(row(native), "");
 }
 
 TEST_F(EditSessionMove, PlacingIsRefusedForClipsAndLanesThatDoNotFit)
@@ -340,6 +356,14 @@ TEST_F(EditSessionMove, TrimmingTheRightEndWithRippleMovesTheLaterClipsAndTheirS
     done(session.trimRight(b, -700, Ripple::Yes));
     EXPECT_EQ(row(primary), "a 0-1000 @0, b 1000-3200 @0, c 3200-4200 @0");
     EXPECT_EQ(row(title), "t 3300-3800 @0");
+}
+
+TEST_F(EditSessionMove, ARippleLeavesTheTrimmedClipWhereItIsThoughItDependsOnALaterOne)
+{
+    done(session.link(c, b));
+    done(session.trimRight(b, 500, Ripple::Yes));
+    EXPECT_EQ(row(primary), "a 0-1000 @0, b 1000-2500 @0, c 2500-3500 @0");
+    EXPECT_THAT(links(), ElementsAre("b(1000)>c(2500)+-1500"));
 }
 
 TEST_F(EditSessionMove, TrimmingLimitsATransitionToWhatIsLeft)
