@@ -2,7 +2,9 @@
 #include "Console.h"
 #include "CurveCommand.h"
 #include "DisplayText.h"
+#include "EditCommand.h"
 #include "MediaProbe.h"
+#include "NewCommand.h"
 #include "PictureCommand.h"
 #include "ProbeCommand.h"
 #include "ShowCommand.h"
@@ -31,6 +33,15 @@ namespace {
 QString fileName(const std::string& argument)
 {
     return QFile::decodeName(QByteArray::fromStdString(argument));
+}
+
+QStringList fileNames(const std::vector<std::string>& arguments)
+{
+    QStringList names;
+    for (const std::string& argument : arguments) {
+        names << fileName(argument);
+    }
+    return names;
 }
 
 /// File names are taken for UTF-8 also where the locale knows none: otherwise Qt could not name them at all.
@@ -71,6 +82,7 @@ struct Arguments
     bool readsTimelines = false;
 
     std::vector<std::string> files;
+    std::vector<std::string> words;
     std::string document;
     bool json = false;
     bool verbose = false;
@@ -86,9 +98,7 @@ Host::ExitCode runProbe(const Arguments& arguments)
 {
     Host::showMediaLibraryLog(arguments.verbose);
     Host::ProbeOptions options;
-    for (const std::string& file : arguments.files) {
-        options.paths << fileName(file);
-    }
+    options.paths = fileNames(arguments.files);
     options.savePath = fileName(arguments.document);
     options.json = arguments.json;
     return Host::probe(options);
@@ -111,6 +121,18 @@ Host::ExitCode runShow(const Arguments& arguments)
 Host::ExitCode runPicture(const Arguments& arguments)
 {
     return Host::drawTimeline(fileName(arguments.document), fileName(arguments.picture));
+}
+
+Host::ExitCode runNew(const Arguments& arguments)
+{
+    Host::showMediaLibraryLog(false);
+    return Host::newProject(fileName(arguments.document), fileNames(arguments.files));
+}
+
+Host::ExitCode runEdit(const Arguments& arguments)
+{
+    Host::showMediaLibraryLog(false);
+    return Host::editProject(fileName(arguments.document), fileNames(arguments.words));
 }
 
 using Runner = Host::ExitCode (*)(const Arguments& arguments);
@@ -183,6 +205,29 @@ void addCurve(CLI::App& app, Arguments& arguments)
                     "Read binary and XML archives too, which must be of your own making");
 }
 
+void addNew(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const command = addCommand(app, arguments, "new", "Make a project of media files", runNew);
+    command->add_option("PROJECT", arguments.document, "Where it goes: .json, .xml or .bin")
+        ->required()
+        ->type_name("")
+        ->check(checkDocumentName);
+    command->add_option("--media", arguments.files, "Video, sound or picture files, laid one after another")
+        ->required()
+        ->type_name("FILE");
+}
+
+void addEdit(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const edit = addCommand(app, arguments, "edit", "Edit the timeline of a project", runEdit);
+    edit->add_option("PROJECT", arguments.document, "A document with a timeline")->required()->type_name("");
+    edit->add_option("EDIT", arguments.words, "One of the edits below; others follow after \"then\"")
+        ->required()
+        ->type_name("");
+    edit->footer(Host::editCommands);
+    edit->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
+}
+
 void addPicture(CLI::App& app, Arguments& arguments)
 {
     CLI::App* const picture =
@@ -229,6 +274,8 @@ int main(int argc, char** argv)
     addProbe(app, arguments);
     addShow(app, arguments);
     addCurve(app, arguments);
+    addNew(app, arguments);
+    addEdit(app, arguments);
     addPicture(app, arguments);
     try {
         app.parse(argc, argv);

@@ -1,0 +1,51 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "NewCommand.h"
+
+#include "MediaClips.h"
+#include "TimelineDocument.h"
+
+#include <QFileInfo>
+
+namespace Host {
+namespace {
+
+bool layAll(EditSession& session, MediaClips& clips, const QStringList& media)
+{
+    bool isDone = true;
+    for (const QString& path : media) {
+        try {
+            if (const EditResult result = lay(session, clips.make(path)); !result) {
+                throw Refusal(path, result.refusal);
+            }
+        } catch (const Refusal& refusal) {
+            writeError(refusal.name, refusal.reason);
+            isDone = false;
+        }
+    }
+    return isDone;
+}
+
+} // namespace
+
+ExitCode newProject(const QString& path, const QStringList& media)
+{
+    try {
+        if (QFileInfo::exists(path)) {
+            throw Refusal(path, "exists already");
+        }
+        EditSession session;
+        MediaClips clips(session);
+        if (!layAll(session, clips, media)) {
+            return Failure;
+        }
+        TimelineDocument::save(*session.timeline(), path);
+        return Success;
+    } catch (const Refusal& refusal) {
+        writeError(refusal.name, refusal.reason);
+    } catch (const Document::Error& error) {
+        writeError(error.what());
+    }
+    return Failure;
+}
+
+} // namespace Host
