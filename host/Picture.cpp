@@ -20,9 +20,15 @@ void paint(const Picture& picture, QPaintDevice& device, double scale)
 
 QByteArray pngOf(const Picture& picture)
 {
-    QImage image(picture.size() * pngScale, QImage::Format_RGB32);
+    const QSize pixels = picture.size() * pngScale;
+    // Painters of pixels go no further.
+    constexpr int mostPixels = 32767;
+    if (pixels.width() > mostPixels || pixels.height() > mostPixels) {
+        throw PictureError("cannot be written: a picture of this size must be an .svg");
+    }
+    QImage image(pixels, QImage::Format_RGB32);
     if (image.isNull()) {
-        throw PictureError("cannot be written: the picture is too large");
+        throw PictureError("cannot be written: there is not enough memory");
     }
     image.fill(Qt::white);
     paint(picture, image, pngScale);

@@ -276,6 +276,25 @@ TEST(TimelinePicture, IsAWellFormedDrawingWithTheFactsInIt)
     }
 }
 
+TEST(TimelinePicture, IsAnSvgWhereItIsTooHighForPixels)
+{
+    SampleTimeline sample;
+    for (int i = 0; i != 300; ++i) {
+        sample.addTrack(AudioTrack);
+    }
+    const TimelinePicture picture(sample.timeline, "tracks");
+    const Folder folder;
+    try {
+        Host::savePicture(picture, folder.path("t.png"), Host::Png);
+        FAIL() << "nothing was thrown";
+    } catch (const Host::PictureError& error) {
+        EXPECT_EQ(error.reason, "cannot be written: a picture of this size must be an .svg");
+    }
+    EXPECT_FALSE(QFile::exists(folder.path("t.png")));
+    Host::savePicture(picture, folder.path("t.svg"), Host::Svg);
+    EXPECT_EQ(readSvg(folder.path("t.svg")).texts.count("Audio"), 300);
+}
+
 TEST(TimelinePicture, WithstandsWhatNoTimelineShouldHold)
 {
     constexpr qint64 highest = std::numeric_limits<qint64>::max();
