@@ -2,8 +2,8 @@
 #include "TransformationPicture.h"
 
 #include "CurveHeader.h"
-#include "PictureStyle.h"
 #include "MediaText.h"
+#include "PictureStyle.h"
 #include "PoseScene.h"
 
 #include <QPainter>
@@ -188,8 +188,8 @@ void TransformationPicture::drawLane(QPainter& painter, const Lane& lane) const
     for (std::size_t i = 0; i != lane.courses.size(); ++i) {
         const Course& course = lane.courses[i];
         for (const TransformationEnvelope::Key& key : m_curve.keys()) {
-            const auto place = std::find(course.progress.begin(), course.progress.end(), key.step);
-            if (place == course.progress.end()) {
+            const auto place = std::lower_bound(course.progress.begin(), course.progress.end(), key.step);
+            if (place == course.progress.end() || *place != key.step) {
                 continue;
             }
             const double value = course.values[static_cast<std::size_t>(place - course.progress.begin())];
