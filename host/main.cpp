@@ -18,6 +18,7 @@
 #include <CLI/CLI.hpp>
 
 #include <clocale>
+#include <csignal>
 #include <cstdlib>
 #include <exception>
 #include <map>
@@ -52,6 +53,16 @@ void useUtf8()
         setenv("LC_ALL", "C.UTF-8", 1);
         std::setlocale(LC_ALL, "");
     }
+}
+
+/// A name that Qt cannot hold would become that of another file.
+std::string checkOutputName(const std::string& name)
+{
+    if (name.empty()) {
+        return "the name of a file is missing";
+    }
+    const bool isKept = QFile::encodeName(fileName(name)).toStdString() == name;
+    return isKept ? std::string() : "the name \"" + name + "\" is not UTF-8";
 }
 
 std::string checkDocumentName(const std::string& name)
@@ -153,6 +164,7 @@ void addProbe(CLI::App& app, Arguments& arguments)
         ->add_option("--save", arguments.document,
                      "Save the descriptions and the resources as a document: .json, .xml or .bin")
         ->type_name("PATH")
+        ->check(checkOutputName)
         ->check(checkDocumentName);
     probe->add_flag("--json", arguments.json, "Print JSON instead of a table");
     probe->add_flag("--verbose", arguments.verbose, "Let FFmpeg's libraries tell what they do");
@@ -179,9 +191,11 @@ void addCurve(CLI::App& app, Arguments& arguments)
     CLI::App* const curve = addCommand(app, arguments, "curve", "Show how an envelope goes", runCurve);
     curve->add_option("DOCUMENT", arguments.document, "A document with a volume or transformation envelope")
         ->required()
-        ->type_name("");
+        ->type_name("")
+        ->check(checkOutputName);
     curve->add_option("-o,--output", arguments.picture, "Draw it as a picture too: .png or .svg")
-        ->type_name("PATH");
+        ->type_name("PATH")
+        ->check(checkOutputName);
     curve->add_option("--length", arguments.length, "How long the envelope is played, in milliseconds")
         ->type_name("MS")
         ->check(CLI::Range(qint64(1), longest).description(""))
@@ -237,7 +251,8 @@ void addPicture(CLI::App& app, Arguments& arguments)
         ->type_name("");
     picture->add_option("OUT", arguments.picture, "Where the picture goes: .png or .svg")
         ->required()
-        ->type_name("");
+        ->type_name("")
+        ->check(checkOutputName);
 }
 
 void showGraveMessages(QtMsgType type, const QMessageLogContext&, const QString& message)
@@ -266,6 +281,8 @@ std::unique_ptr<QCoreApplication> makeApplication(bool hasPictures, int& argc, c
 int main(int argc, char** argv)
 {
     useUtf8();
+    // A reader who ends early must not keep what is to be saved from being saved.
+    std::signal(SIGPIPE, SIG_IGN);
 
     Arguments arguments;
     CLI::App app("Describes media files, edits and draws timelines, and draws envelopes.", "editormodel");

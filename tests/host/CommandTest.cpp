@@ -7,6 +7,7 @@
 #include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/persistence/Document.h>
 
+#include <QDir>
 #include <QImage>
 #include <QStringList>
 
@@ -359,6 +360,41 @@ TEST(CurveCommand, ShowsTheFirstEnvelopeWhicheverItIs)
     Document::saveFile(folder.path("b.json"), {&file, &volume, &transformation}, Document::Json,
                        Document::Stream);
     EXPECT_THAT(editormodel({"curve", "b.json"}, folder.path()).output, StartsWith("Volume envelope"));
+}
+
+/// Qt would write to another name.
+TEST(Command, WritesToNoNameThatItCannotTake)
+{
+    const Folder folder;
+    folder.copy("speech.wav", "a.wav");
+    ASSERT_EQ(editormodel({"curve", "--sample", "volume", "v.json"}, folder.path()).exitCode, 0);
+    const QStringList before = QDir(folder.path()).entryList();
+    for (const char* arguments :
+         {"probe a.wav --save \"$(printf 'caf\\351.json')\"", "curve v.json -o \"$(printf 'caf\\351.png')\"",
+          "curve --sample volume \"$(printf 'caf\\351.json')\"",
+          "picture v.json \"$(printf 'caf\\351.svg')\""}) {
+        const Outcome outcome =
+            run("/bin/sh", {"-c", QString("exec \"$0\" ") + arguments, EDITORMODEL_COMMAND}, folder.path());
+        EXPECT_EQ(outcome.exitCode, 2) << arguments;
+        EXPECT_THAT(outcome.errors, AllOf(HasSubstr("caf\uFFFD"), HasSubstr("is not UTF-8")));
+        EXPECT_THAT(outcome.output, IsEmpty());
+    }
+    EXPECT_EQ(editormodel({"curve", "v.json", "-o", ""}, folder.path()).exitCode, 2);
+    EXPECT_EQ(QDir(folder.path()).entryList(), before);
+}
+
+TEST(ProbeCommand, SavesAlsoWhereNobodyReadsItsOutput)
+{
+    const Folder folder;
+    folder.copy("speech.wav", "a.wav");
+    // The reader has ended before anything is written.
+    const Outcome outcome = run(
+        "/bin/sh",
+        {"-c", "{ sleep 0.3; \"$0\" probe a.wav --save a.json; echo $? >code; } | true", EDITORMODEL_COMMAND},
+        folder.path());
+    EXPECT_EQ(outcome.errors, "standard output: cannot be written\n");
+    EXPECT_EQ(contentOf(folder.path("code")), "1\n");
+    EXPECT_EQ(editormodel({"show", "a.json"}, folder.path()).exitCode, 0);
 }
 
 TEST(CurveCommand, TellsInOneLineWhatIsWrong)
