@@ -225,6 +225,7 @@ void addNew(CLI::App& app, Arguments& arguments)
     command->add_option("PROJECT", arguments.document, "Where it goes: .json, .xml or .bin")
         ->required()
         ->type_name("")
+        ->check(checkOutputName)
         ->check(checkDocumentName);
     command->add_option("--media", arguments.files, "Video, sound or picture files, laid one after another")
         ->required()

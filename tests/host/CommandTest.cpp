@@ -372,7 +372,7 @@ TEST(Command, WritesToNoNameThatItCannotTake)
     for (const char* arguments :
          {"probe a.wav --save \"$(printf 'caf\\351.json')\"", "curve v.json -o \"$(printf 'caf\\351.png')\"",
           "curve --sample volume \"$(printf 'caf\\351.json')\"",
-          "picture v.json \"$(printf 'caf\\351.svg')\""}) {
+          "picture v.json \"$(printf 'caf\\351.svg')\"", "new \"$(printf 'caf\\351.json')\" --media a.wav"}) {
         const Outcome outcome =
             run("/bin/sh", {"-c", QString("exec \"$0\" ") + arguments, EDITORMODEL_COMMAND}, folder.path());
         EXPECT_EQ(outcome.exitCode, 2) << arguments;
