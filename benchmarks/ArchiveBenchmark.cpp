@@ -1,31 +1,19 @@
 // SPDX-License-Identifier: Apache-2.0
 // Ten thousand records with pointers, saved and loaded: through the library's field lists, beside the same
 // records with Boost.Serialization's templates, and with a tree of nlohmann json, used by hand.
+#include "ArchiveRuns.h"
 #include "Ratio.h"
 
 #include <EditorModel/bus/PubSub.h>
-#include <EditorModel/persistence/Document.h>
 #include <EditorModel/persistence/Fields.h>
-#include <EditorModel/persistence/Json.h>
 #include <EditorModel/types/MTime.h>
 
-#include <boost/archive/binary_iarchive.hpp>
-#include <boost/archive/binary_oarchive.hpp>
-#include <boost/archive/xml_iarchive.hpp>
-#include <boost/archive/xml_oarchive.hpp>
 #include <boost/serialization/deque.hpp>
 #include <boost/serialization/export.hpp>
-#include <boost/serialization/nvp.hpp>
 #include <boost/serialization/string.hpp>
 
 #include <benchmark/benchmark.h>
 
-#include <QBuffer>
-
-#include <malloc.h>
-
-#include <sstream>
-#include <stdexcept>
 #include <unordered_map>
 
 namespace Listed {
@@ -61,6 +49,13 @@ void fields(Serialize::Fields& f, Record& record)
 void fields(Serialize::Fields& f, Content& content)
 {
     f("records", content.records);
+}
+
+void freeGraph(const Content* content)
+{
+    for (const Record* const record : content->records)
+        delete record;
+    delete content;
 }
 
 } // namespace Listed
@@ -126,6 +121,13 @@ struct Content : Root, virtual PubSub::Object
     }
 };
 
+void freeGraph(const Content* content)
+{
+    for (const Record* const record : content->records)
+        delete record;
+    delete content;
+}
+
 } // namespace ByHand
 
 BOOST_CLASS_EXPORT_GUID(ByHand::Record, "Hand_::Record")
@@ -133,8 +135,7 @@ BOOST_CLASS_EXPORT_GUID(ByHand::Content, "Hand_::Content")
 
 namespace {
 
-using boost::serialization::make_nvp;
-using nlohmann::json;
+using namespace ArchiveRuns;
 
 constexpr int recordCount = 10000;
 
@@ -164,49 +165,6 @@ struct Records
 
 using ListedRecords = Records<Listed::Record, Listed::Content>;
 using HandRecords = Records<ByHand::Record, ByHand::Content>;
-
-template <class Content>
-void freeRecords(Content* content)
-{
-    for (const auto* const record : content->records)
-        delete record;
-    delete content;
-}
-
-template <class Archive, class Content>
-std::string stored(const Content& content)
-{
-    std::ostringstream stream;
-    {
-        Archive archive(stream);
-        const Content* const root = &content;
-        archive << make_nvp("content", root);
-    }
-    return stream.str();
-}
-
-template <class Archive, class Content>
-void boostSave(benchmark::State& state, const Content& content)
-{
-    for (auto _ : state)
-        benchmark::DoNotOptimize(stored<Archive>(content));
-}
-
-template <class Output, class Input, class Content>
-void boostLoad(benchmark::State& state, const Content& content)
-{
-    const std::string text = stored<Output>(content);
-    for (auto _ : state) {
-        std::istringstream stream(text);
-        Content* loaded = nullptr;
-        {
-            Input archive(stream);
-            archive >> make_nvp("content", loaded);
-        }
-        benchmark::DoNotOptimize(loaded->records.size());
-        freeRecords(loaded);
-    }
-}
 
 /// The tree that the Json archive makes, written down by hand.
 json treeByHand(const ByHand::Content& content)
@@ -293,17 +251,6 @@ ByHand::Content* readByHand(const json& root)
     return content;
 }
 
-std::string jsonByArchive(const Listed::Content& content)
-{
-    json root;
-    {
-        Serialize::Json::oarchive archive(root);
-        const Listed::Content* const object = &content;
-        archive << make_nvp("content", object);
-    }
-    return root.dump();
-}
-
 const ListedRecords& listed()
 {
     static const ListedRecords records;
@@ -316,106 +263,67 @@ const HandRecords& byHand()
     return records;
 }
 
-void jsonSave(benchmark::State& state)
+void JsonSave(benchmark::State& state)
 {
-    if (jsonByArchive(listed().content) != treeByHand(byHand().content).dump())
+    if (storedAsJson(listed().content) != treeByHand(byHand().content).dump())
         state.SkipWithError("the tree written by hand is not the archive's");
-    for (auto _ : state)
-        benchmark::DoNotOptimize(jsonByArchive(listed().content));
+    runSave(state, [] { return storedAsJson(listed().content); });
+}
+void JsonSaveByHand(benchmark::State& state)
+{
+    runSave(state, [] { return treeByHand(byHand().content).dump(); });
+}
+void JsonLoad(benchmark::State& state)
+{
+    runLoad(state, storedAsJson(listed().content), &loadedFromJson<Listed::Content>);
+}
+void JsonLoadByHand(benchmark::State& state)
+{
+    runLoad(state, storedAsJson(listed().content),
+            [](const std::string& text) { return readByHand(json::parse(text)); });
 }
 
-void jsonSaveByHand(benchmark::State& state)
+void BinarySave(benchmark::State& state)
 {
-    for (auto _ : state)
-        benchmark::DoNotOptimize(treeByHand(byHand().content).dump());
+    runSave(state, [] { return stored<binary_oarchive>(listed().content); });
 }
-
-void jsonLoad(benchmark::State& state)
+void BinarySaveByHand(benchmark::State& state)
 {
-    const std::string text = jsonByArchive(listed().content);
-    for (auto _ : state) {
-        const json root = json::parse(text);
-        Listed::Content* content = nullptr;
-        Serialize::Json::iarchive archive(root);
-        archive >> make_nvp("content", content);
-        benchmark::DoNotOptimize(content->records.size());
-        freeRecords(content);
-    }
+    runSave(state, [] { return stored<binary_oarchive>(byHand().content); });
 }
-
-void jsonLoadByHand(benchmark::State& state)
+void BinaryLoad(benchmark::State& state)
 {
-    const std::string text = jsonByArchive(listed().content);
-    for (auto _ : state) {
-        const json root = json::parse(text);
-        auto* const content = readByHand(root);
-        benchmark::DoNotOptimize(content->records.size());
-        freeRecords(content);
-    }
+    runLoad(state, stored<binary_oarchive>(listed().content), &loaded<binary_iarchive, Listed::Content>);
 }
-
-QByteArray documentOf(Document::Form form, Document::Route route)
+void BinaryLoadByHand(benchmark::State& state)
 {
-    QBuffer buffer;
-    buffer.open(QIODevice::WriteOnly);
-    Document::save(buffer, listed().content, form, route);
-    return buffer.data();
+    runLoad(state, stored<binary_oarchive>(byHand().content), &loaded<binary_iarchive, ByHand::Content>);
+}
+void XmlSave(benchmark::State& state)
+{
+    runSave(state, [] { return stored<xml_oarchive>(listed().content); });
+}
+void XmlSaveByHand(benchmark::State& state)
+{
+    runSave(state, [] { return stored<xml_oarchive>(byHand().content); });
+}
+void XmlLoad(benchmark::State& state)
+{
+    runLoad(state, stored<xml_oarchive>(listed().content), &loaded<xml_iarchive, Listed::Content>);
+}
+void XmlLoadByHand(benchmark::State& state)
+{
+    runLoad(state, stored<xml_oarchive>(byHand().content), &loaded<xml_iarchive, ByHand::Content>);
 }
 
 void documentSave(benchmark::State& state, Document::Form form, Document::Route route)
 {
-    qint64 size = 0;
-    for (auto _ : state)
-        size = documentOf(form, route).size();
-    state.counters["bytes/record"] = static_cast<double>(size) / recordCount;
+    runDocumentSave(state, listed().content, recordCount, form, route);
 }
 
 void documentLoad(benchmark::State& state, Document::Form form, Document::Route route)
 {
-    QByteArray document = documentOf(form, route);
-    for (auto _ : state) {
-        QBuffer buffer(&document);
-        buffer.open(QIODevice::ReadOnly);
-        benchmark::DoNotOptimize(Document::load(buffer).size());
-    }
-}
-
-using boost::archive::binary_iarchive;
-using boost::archive::binary_oarchive;
-using boost::archive::xml_iarchive;
-using boost::archive::xml_oarchive;
-
-void BinarySave(benchmark::State& state)
-{
-    boostSave<binary_oarchive>(state, listed().content);
-}
-void BinarySaveByHand(benchmark::State& state)
-{
-    boostSave<binary_oarchive>(state, byHand().content);
-}
-void BinaryLoad(benchmark::State& state)
-{
-    boostLoad<binary_oarchive, binary_iarchive>(state, listed().content);
-}
-void BinaryLoadByHand(benchmark::State& state)
-{
-    boostLoad<binary_oarchive, binary_iarchive>(state, byHand().content);
-}
-void XmlSave(benchmark::State& state)
-{
-    boostSave<xml_oarchive>(state, listed().content);
-}
-void XmlSaveByHand(benchmark::State& state)
-{
-    boostSave<xml_oarchive>(state, byHand().content);
-}
-void XmlLoad(benchmark::State& state)
-{
-    boostLoad<xml_oarchive, xml_iarchive>(state, listed().content);
-}
-void XmlLoadByHand(benchmark::State& state)
-{
-    boostLoad<xml_oarchive, xml_iarchive>(state, byHand().content);
+    runDocumentLoad(state, listed().content, form, route);
 }
 
 BENCHMARK(BinarySave);
@@ -426,10 +334,10 @@ BENCHMARK(XmlSave);
 BENCHMARK(XmlSaveByHand);
 BENCHMARK(XmlLoad);
 BENCHMARK(XmlLoadByHand);
-BENCHMARK(jsonSave)->Name("JsonSave");
-BENCHMARK(jsonSaveByHand)->Name("JsonSaveByHand");
-BENCHMARK(jsonLoad)->Name("JsonLoad");
-BENCHMARK(jsonLoadByHand)->Name("JsonLoadByHand");
+BENCHMARK(JsonSave);
+BENCHMARK(JsonSaveByHand);
+BENCHMARK(JsonLoad);
+BENCHMARK(JsonLoadByHand);
 
 #define DOCUMENT_BENCHMARKS(Form, Route)                                                                     \
     BENCHMARK_CAPTURE(documentSave, Form##Route, Document::Form, Document::Route);                           \
@@ -456,9 +364,6 @@ const bool compared =
 
 int main(int argc, char** argv)
 {
-    // Memory that goes back to the system between two rounds would be measured with whichever asks for it
-    // next.
-    mallopt(M_TRIM_THRESHOLD, 1 << 30);
-    mallopt(M_MMAP_THRESHOLD, 1 << 30);
+    keepMemory();
     return Ratios::run(argc, argv);
 }
