@@ -120,8 +120,9 @@ QByteArray cutWithin(const QByteArray& document, double part, const Way& way)
         return framed(document.mid(frameLength, place(document.size() - frameLength)), document);
     case Document::Xml:
         if (way.route == Document::Archive) {
+            // The reader reads beyond a key whose end tag is a longer one: no tag is to be read on from here.
             const int end = document.lastIndexOf("</boost_serialization>");
-            return sealed(document.left(place(end)) + document.mid(end, document.lastIndexOf("<!--") - end));
+            return sealed(document.left(place(end)) + "<&" + withoutSeal(document).mid(end));
         }
         return document.left(place(document.size()));
     case Document::Json:
