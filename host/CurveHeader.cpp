@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "CurveHeader.h"
 
-#include "PictureStyle.h"
 #include "MediaText.h"
+#include "PictureStyle.h"
 
 #include <QFontMetricsF>
 #include <QPainter>
