@@ -192,4 +192,13 @@ TEST(MotionTrackingMessages, HoldWhatTheyAreMadeWith)
     EXPECT_EQ(LoadTrackingNotification(&sender, loaded).data, loaded);
 }
 
+TEST(LostMotionTracking, IsAskedToTheEndWhileWhoeverAnswersChangesTheClip)
+{
+    Holder holder({"a", "b"});
+    Clip clip = clipWith({"a", "b", "c"});
+    holder.beforeAnswering = [&](const IsAvailableTrackingRequest&) { clip.setMotionTrackings({}); };
+    EXPECT_TRUE(clip.hasLostMotionTracking());
+    EXPECT_THAT(holder.questions, ElementsAre("a", "b", "c"));
+}
+
 } // namespace

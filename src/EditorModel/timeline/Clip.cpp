@@ -220,7 +220,9 @@ Clip* Clip::removeMotionTracking(const QString& id)
 
 bool Clip::hasLostMotionTracking() const
 {
-    return !std::all_of(motionTrackings.begin(), motionTrackings.end(),
+    // Whoever answers may change the clip.
+    const std::set<QString> asked = motionTrackings;
+    return !std::all_of(asked.begin(), asked.end(),
                         [](const QString& id) { return MotionTracking::Helper().isAvailable(id); });
 }
 

@@ -134,8 +134,7 @@ public:
     /// start, transitions and fades stay. The clip must not be null.
     Object* setClipSpeed(const Clip* clip, double speed);
 
-    /// False on a native audio track and for clips of the three intro types. Strict; the track must not be
-    /// null.
+    /// False on a native audio track and for clips of the three intro types. Strict.
     bool canEditTiming(const Clip* clip) const;
     /// Whether the clip can be cut `offset` behind its start: there must be Clip::MIN_DURATION or more from
     /// the inbound transition to the cut, and more than that from the cut to the outbound transition. False
