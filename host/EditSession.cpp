@@ -8,7 +8,7 @@
 
 #include <EditorModel/effects/Transition.h>
 
-#include <cmath>
+#include <algorithm>
 #include <utility>
 #include <vector>
 
@@ -291,8 +291,10 @@ EditResult EditSession::setSpeed(const Clip* clip, double speed, Ripple ripple)
         ClipTiming& timing = draft.timing(clip);
         const ClipTiming before = timing;
         const double length = double(clip->sourceDuration.ms()) / speed;
-        // Not-a-number is refused by it too.
-        if (!(length > 0 && length <= double(LATEST_TIME.ms())) || before.sourceDuration <= MTime()) {
+        // A source of fewer milliseconds would lose its speed to rounding. Not-a-number is refused as well.
+        const bool isPlayable =
+            length >= double(Clip::MIN_DURATION.ms()) && length <= double(LATEST_TIME.ms());
+        if (!isPlayable || before.sourceDuration <= MTime()) {
             throw EditRefused{"The " + clipText(clip) + " at " + timeText(before.timestamp) +
                               QString(" can't be played at a speed of %1.").arg(speed)};
         }

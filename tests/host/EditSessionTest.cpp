@@ -520,6 +520,19 @@ TEST_F(EditSessionMove, ImpossibleSpeedsAreRefused)
     refused(session.setSpeed(b, 220), {"\"b\"", "00:00:00.009"});
 }
 
+/// Its speed would be lost to rounding, and it could not be played slower again.
+TEST_F(EditSessionMove, NoSourceIsPlayedInFewerMillisecondsThanTheShortestClip)
+{
+    Clip* const still = picture("still", 4000);
+    still->setUnlimitedDuration(true);
+    done(session.append({still, extra, 0, 0, 100000}));
+    refused(session.setSpeed(still, 401), {"\"still\""});
+    done(session.setSpeed(still, 400));
+    EXPECT_EQ(row(extra), "still 0-250 @0");
+    done(session.setSpeed(still, 1));
+    EXPECT_EQ(row(extra), "still 0-100000 @0");
+}
+
 TEST_F(EditSessionMove, ReversingMirrorsTheStretch)
 {
     done(session.reverse(b));
