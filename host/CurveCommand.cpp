@@ -3,8 +3,9 @@
 
 #include "CurveSample.h"
 #include "CurveText.h"
-#include "MediaInput.h"
+#include "DocumentFile.h"
 #include "Picture.h"
+#include "Refusal.h"
 #include "TransformationPicture.h"
 #include "VolumePicture.h"
 
@@ -17,32 +18,20 @@
 namespace Host {
 namespace {
 
-/// Why the command cannot go on: the name of a file, and a line that completes "The file ...".
-struct Refusal
-{
-    QString name;
-    QString reason;
-};
-
 void writeSample(const CurveOptions& options)
 {
-    const auto form = Document::formOfPath(options.document);
-    if (!form) {
-        throw Refusal{options.document, "is no name of a document: such a name ends in .json, .xml or .bin"};
-    }
     const VolumeEnvelope volume = sampleVolumeEnvelope();
     const TransformationEnvelope transformation = sampleTransformationEnvelope();
     const Serialize::ISerializable* const root = options.sample == VolumeSample
                                                      ? static_cast<const Serialize::ISerializable*>(&volume)
                                                      : &transformation;
-    Document::saveFile(options.document, {root}, *form, Document::Stream);
+    saveDocument({root}, options.document);
 }
 
 [[noreturn]] void refuseContent(const CurveOptions& options, const Document::Graph& graph)
 {
-    const Serialize::ISerializable* const root = graph.rootAs<Serialize::ISerializable>();
-    const QString content = root ? QString::fromStdString(root->GetNameInArchive()) : "nothing";
-    throw Refusal{options.document, "holds neither a volume nor a transformation envelope, but " + content};
+    throw Refusal(options.document,
+                  "holds neither a volume nor a transformation envelope, but " + contentOf(graph));
 }
 
 CurveTextSize textSize(const CurveOptions& options)
@@ -75,7 +64,7 @@ bool showTransformation(const TransformationEnvelope& envelope, const CurveOptio
                         const std::optional<PictureForm>& form)
 {
     if (options.span.hasFades()) {
-        throw Refusal{options.document, "holds a transformation envelope, which takes no fades"};
+        throw Refusal(options.document, "holds a transformation envelope, which takes no fades");
     }
     const TransformationCurve found(envelope, options.span.length);
     const auto picture = form ? std::make_unique<TransformationPicture>(found) : nullptr;
@@ -84,9 +73,8 @@ bool showTransformation(const TransformationEnvelope& envelope, const CurveOptio
 
 bool showCurve(const CurveOptions& options, const std::optional<PictureForm>& form)
 {
-    requireFile(options.document);
-    const Document::Graph graph = Document::loadFile(
-        options.document, options.isOwn ? Document::OwnDocuments : Document::ForeignDocuments);
+    const Document::Graph graph =
+        loadDocument(options.document, options.isOwn ? Document::OwnDocuments : Document::ForeignDocuments);
     for (const Serialize::ISerializable* root : graph.roots()) {
         if (const auto* const volume = dynamic_cast<const VolumeEnvelope*>(root)) {
             return showVolume(*volume, options, form);
@@ -102,25 +90,16 @@ bool showCurve(const CurveOptions& options, const std::optional<PictureForm>& fo
 
 ExitCode curve(const CurveOptions& options)
 {
-    try {
-        const std::optional<PictureForm> form = pictureFormOfPath(options.picturePath);
-        if (!form && !options.picturePath.isEmpty()) {
-            throw Refusal{options.picturePath, "is no name of a picture: such a name ends in .png or .svg"};
+    return unlessRefused([&] {
+        std::optional<PictureForm> form;
+        if (!options.picturePath.isEmpty()) {
+            form = requirePictureForm(options.picturePath);
         }
         if (options.sample != NoSample) {
             writeSample(options);
         }
         return showCurve(options, form) ? Success : Failure;
-    } catch (const Refusal& refusal) {
-        writeError(refusal.name, refusal.reason);
-    } catch (const MediaError& error) {
-        writeError(options.document, error.reason);
-    } catch (const PictureError& error) {
-        writeError(options.picturePath, error.reason);
-    } catch (const Document::Error& error) {
-        writeError(error.what());
-    }
-    return Failure;
+    });
 }
 
 } // namespace Host

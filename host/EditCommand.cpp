@@ -2,6 +2,7 @@
 #include "EditCommand.h"
 
 #include "EditScript.h"
+#include "Refusal.h"
 #include "TimelineDocument.h"
 
 namespace Host {
@@ -47,7 +48,7 @@ With ripple the clips behind follow.
 
 ExitCode editProject(const QString& path, const QStringList& words)
 {
-    try {
+    return unlessRefused([&] {
         const TimelineDocument document = TimelineDocument::load(path);
         EditSession session(&document.timeline());
         EditScript script(session);
@@ -56,12 +57,7 @@ ExitCode editProject(const QString& path, const QStringList& words)
         }
         document.save(path);
         return Success;
-    } catch (const Refusal& refusal) {
-        writeError(refusal.name, refusal.reason);
-    } catch (const Document::Error& error) {
-        writeError(error.what());
-    }
-    return Failure;
+    });
 }
 
 } // namespace Host

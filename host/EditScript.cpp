@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "EditScript.h"
 
+#include "Refusal.h"
 #include "TimeText.h"
-#include "TimelineDocument.h"
 #include "TimelineOutline.h"
 
 #include <EditorModel/effects/Transition.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "MediaClips.h"
 
-#include "TimelineDocument.h"
+#include "Refusal.h"
 
 #include <QFileInfo>
 

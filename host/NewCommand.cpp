@@ -2,6 +2,7 @@
 #include "NewCommand.h"
 
 #include "MediaClips.h"
+#include "Refusal.h"
 #include "TimelineDocument.h"
 
 #include <QFileInfo>
@@ -29,7 +30,7 @@ bool layAll(EditSession& session, MediaClips& clips, const QStringList& media)
 
 ExitCode newProject(const QString& path, const QStringList& media)
 {
-    try {
+    return unlessRefused([&] {
         if (QFileInfo::exists(path)) {
             throw Refusal(path, "exists already");
         }
@@ -40,12 +41,7 @@ ExitCode newProject(const QString& path, const QStringList& media)
         }
         TimelineDocument::save(*session.timeline(), path);
         return Success;
-    } catch (const Refusal& refusal) {
-        writeError(refusal.name, refusal.reason);
-    } catch (const Document::Error& error) {
-        writeError(error.what());
-    }
-    return Failure;
+    });
 }
 
 } // namespace Host

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Picture.h"
 
+#include "Refusal.h"
+
 #include <QBuffer>
 #include <QImage>
 #include <QPainter>
@@ -18,24 +20,24 @@ void paint(const Picture& picture, QPaintDevice& device, double scale)
     picture.draw(painter);
 }
 
-QByteArray pngOf(const Picture& picture)
+QByteArray pngOf(const Picture& picture, const QString& path)
 {
     const QSize pixels = picture.size() * pngScale;
     // Painters of pixels go no further.
     constexpr int mostPixels = 32767;
     if (pixels.width() > mostPixels || pixels.height() > mostPixels) {
-        throw PictureError("cannot be written: a picture of this size must be an .svg");
+        throw Refusal(path, "cannot be written: a picture of this size must be an .svg");
     }
     QImage image(pixels, QImage::Format_RGB32);
     if (image.isNull()) {
-        throw PictureError("cannot be written: there is not enough memory");
+        throw Refusal(path, "cannot be written: there is not enough memory");
     }
     image.fill(Qt::white);
     paint(picture, image, pngScale);
     QBuffer buffer;
     buffer.open(QBuffer::WriteOnly);
     if (!image.save(&buffer, "PNG")) {
-        throw PictureError("cannot be written: the picture cannot be encoded");
+        throw Refusal(path, "cannot be written: the picture cannot be encoded");
     }
     return buffer.data();
 }
@@ -68,14 +70,21 @@ std::optional<PictureForm> pictureFormOfPath(const QString& path)
     return std::nullopt;
 }
 
-PictureError::PictureError(const QString& why) : std::runtime_error(why.toStdString()), reason(why) {}
+PictureForm requirePictureForm(const QString& path)
+{
+    const std::optional<PictureForm> form = pictureFormOfPath(path);
+    if (!form) {
+        throw Refusal(path, "is no name of a picture: such a name ends in .png or .svg");
+    }
+    return *form;
+}
 
 void savePicture(const Picture& picture, const QString& path, PictureForm form)
 {
-    const QByteArray content = form == Png ? pngOf(picture) : svgOf(picture);
+    const QByteArray content = form == Png ? pngOf(picture, path) : svgOf(picture);
     QSaveFile file(path);
     if (!file.open(QSaveFile::WriteOnly) || file.write(content) != content.size() || !file.commit()) {
-        throw PictureError("cannot be written: " + file.errorString());
+        throw Refusal(path, "cannot be written: " + file.errorString());
     }
 }
 

@@ -35,20 +35,13 @@ enum PictureForm : int
 
 /// By the ending of the name, in any case: .png, .svg; none for any other.
 std::optional<PictureForm> pictureFormOfPath(const QString& path);
-
-/// Why a picture could not be written: one line that completes "The file ...".
-class PictureError : public std::runtime_error
-{
-public:
-    explicit PictureError(const QString& why);
-
-    const QString reason;
-};
+/// The same; throws Refusal for any other.
+PictureForm requirePictureForm(const QString& path);
 
 /// How many pixels of a PNG file stand for one unit of the picture, in each direction.
 constexpr int pngScale = 2;
 
-/// Replaces the file as a whole or not at all; throws PictureError.
+/// Replaces the file as a whole or not at all; throws Refusal.
 void savePicture(const Picture& picture, const QString& path, PictureForm form);
 
 } // namespace Host

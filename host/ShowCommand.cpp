@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "ShowCommand.h"
 
-#include "MediaInput.h"
+#include "DocumentFile.h"
 #include "MediaTable.h"
+#include "Refusal.h"
 #include "ResourceText.h"
 #include "TimelineTable.h"
 
@@ -54,23 +55,14 @@ std::string textOf(const Document::Graph& graph)
 
 ExitCode show(const QString& path)
 {
-    try {
-        requireFile(path);
+    return unlessRefused([&] {
         // What the commands write is read from anybody; nothing else needs to be.
-        const Document::Graph graph = Document::loadFile(path, Document::ForeignDocuments);
-        const std::string text = textOf(graph);
+        const std::string text = textOf(loadDocument(path));
         if (text.empty()) {
-            writeError(path, "holds no timeline, no descriptions of media files and no resources");
-            return Failure;
+            throw Refusal(path, "holds no timeline, no descriptions of media files and no resources");
         }
         return writeOutput(text) ? Success : Failure;
-    } catch (const MediaError& error) {
-        writeError(path, error.reason);
-        return Failure;
-    } catch (const Document::Error& error) {
-        writeError(error.what());
-        return Failure;
-    }
+    });
 }
 
 } // namespace Host

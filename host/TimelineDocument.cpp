@@ -1,43 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "TimelineDocument.h"
 
-#include "MediaInput.h"
+#include "DocumentFile.h"
+#include "Refusal.h"
 
-#include <deque>
 #include <utility>
 
 namespace Host {
-namespace {
-
-void saveRoots(const std::deque<const Serialize::ISerializable*>& roots, const QString& path)
-{
-    const auto form = Document::formOfPath(path);
-    if (!form) {
-        throw Refusal(path, "is no name of a document: such a name ends in .json, .xml or .bin");
-    }
-    Document::saveFile(path, roots, *form, Document::Stream);
-}
-
-QString contentOf(const Document::Graph& graph)
-{
-    const auto* const root = graph.rootAs<Serialize::ISerializable>();
-    return root ? QString::fromStdString(root->GetNameInArchive()) : "nothing";
-}
-
-} // namespace
-
-Refusal::Refusal(const QString& about, const QString& why)
-    : std::runtime_error((about + ": " + why).toStdString()), name(about), reason(why)
-{}
-
 TimelineDocument TimelineDocument::load(const QString& path)
 {
-    try {
-        requireFile(path);
-    } catch (const MediaError& error) {
-        throw Refusal(path, error.reason);
-    }
-    Document::Graph graph = Document::loadFile(path, Document::ForeignDocuments);
+    Document::Graph graph = loadDocument(path);
     Timeline::Object* const timeline = timelineOf(graph);
     if (!timeline) {
         throw Refusal(path, "holds no timeline, but " + contentOf(graph));
@@ -47,12 +19,12 @@ TimelineDocument TimelineDocument::load(const QString& path)
 
 void TimelineDocument::save(const Timeline::Object& timeline, const QString& path)
 {
-    saveRoots({&timeline}, path);
+    saveDocument({&timeline}, path);
 }
 
 void TimelineDocument::save(const QString& path) const
 {
-    saveRoots({m_graph.roots().begin(), m_graph.roots().end()}, path);
+    saveDocument({m_graph.roots().begin(), m_graph.roots().end()}, path);
 }
 
 TimelineDocument::TimelineDocument(Document::Graph graph, Timeline::Object* timeline)

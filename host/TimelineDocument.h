@@ -6,19 +6,7 @@
 
 #include <QString>
 
-#include <stdexcept>
-
 namespace Host {
-
-/// Why a command cannot go on: the name of what it is about, and a line that completes "The file ...".
-class Refusal : public std::runtime_error
-{
-public:
-    Refusal(const QString& about, const QString& why);
-
-    const QString name;
-    const QString reason;
-};
 
 /// A timeline and all that it points at, as a document holds them.
 class TimelineDocument

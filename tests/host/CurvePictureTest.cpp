@@ -4,6 +4,7 @@
 
 #include "host/Picture.h"
 #include "host/PictureStyle.h"
+#include "host/Refusal.h"
 #include "host/TransformationPicture.h"
 #include "host/VolumePicture.h"
 
@@ -233,7 +234,7 @@ TEST(SavedPicture, TellsWhyItCannotBeWritten)
     try {
         Host::savePicture(picture, "/no/such/folder/a.png", Host::Png);
         FAIL() << "nothing was thrown";
-    } catch (const Host::PictureError& error) {
+    } catch (const Host::Refusal& error) {
         EXPECT_TRUE(error.reason.startsWith("cannot be written: ")) << error.what();
     }
 }

@@ -2,6 +2,7 @@
 #include "Pictures.h"
 #include "SampleTimeline.h"
 
+#include "host/Refusal.h"
 #include "host/TimelineClipBox.h"
 #include "host/TimelinePicture.h"
 #include "host/TimelineRuler.h"
@@ -287,7 +288,7 @@ TEST(TimelinePicture, IsAnSvgWhereItIsTooHighForPixels)
     try {
         Host::savePicture(picture, folder.path("t.png"), Host::Png);
         FAIL() << "nothing was thrown";
-    } catch (const Host::PictureError& error) {
+    } catch (const Host::Refusal& error) {
         EXPECT_EQ(error.reason, "cannot be written: a picture of this size must be an .svg");
     }
     EXPECT_FALSE(QFile::exists(folder.path("t.png")));
