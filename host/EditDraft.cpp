@@ -52,14 +52,19 @@ EditDraft::Clips EditDraft::laterClips(const Lane& lane, MTime from) const
 
 EditDraft::Clips EditDraft::withDependants(const Clips& clips, const Clip* fixed) const
 {
+    // One walk over the links, not one for each clip: a ripple takes most of a timeline along.
+    const auto slavesOf = m_timeline.master2slaves();
     Clips all;
     std::deque<const Clip*> queue(clips.begin(), clips.end());
     while (!queue.empty()) {
         const Clip* const clip = queue.front();
         queue.pop_front();
-        if (clip != fixed && all.insert(clip).second) {
-            const Clips slaves = m_timeline.findSlaves(clip);
-            queue.insert(queue.end(), slaves.begin(), slaves.end());
+        if (clip == fixed || !all.insert(clip).second) {
+            continue;
+        }
+        const auto slaves = slavesOf.find(clip);
+        if (slaves != slavesOf.end()) {
+            queue.insert(queue.end(), slaves->second.begin(), slaves->second.end());
         }
     }
     return all;
@@ -74,6 +79,9 @@ MTime EditDraft::distance(const Clip* master, const Clip* slave) const
 
 void EditDraft::shift(const Clips& clips, MTime delta)
 {
+    if (delta == MTime()) {
+        return;
+    }
     for (const Clip* const clip : clips) {
         const bool followsMaster =
             m_timeline.isNativeAudio(clip) && clips.count(m_timeline.masterOf(clip)) != 0;
@@ -87,9 +95,7 @@ void EditDraft::shift(const Clips& clips, MTime delta)
 
 void EditDraft::ripple(const Lane& lane, MTime from, MTime delta, const Clip* fixed)
 {
-    if (delta != MTime()) {
-        shift(withDependants(laterClips(lane, from), fixed), delta);
-    }
+    shift(withDependants(laterClips(lane, from), fixed), delta);
 }
 
 // Links

@@ -89,4 +89,21 @@ private:
     Timeline::Object m_before;
 };
 
+/// Three clips in a row on the primary track, and one that lies nowhere.
+class ThreeInARow : public EditFixture
+{
+protected:
+    ThreeInARow()
+    {
+        lay(a, primary, 0, 1000);
+        lay(b, primary, 1000, 2000);
+        lay(c, primary, 3000, 1000);
+    }
+
+    Clip* a = picture("a");
+    Clip* b = picture("b");
+    Clip* c = picture("c");
+    Clip* x = picture("x");
+};
+
 } // namespace EditTests

@@ -11,22 +11,8 @@ using testing::ElementsAre;
 using testing::IsEmpty;
 using testing::Pair;
 
-/// Three clips in a row on the primary track.
-class EditSessionStructure : public EditFixture
-{
-protected:
-    EditSessionStructure()
-    {
-        lay(a, primary, 0, 1000);
-        lay(b, primary, 1000, 2000);
-        lay(c, primary, 3000, 1000);
-    }
-
-    Clip* a = picture("a");
-    Clip* b = picture("b");
-    Clip* c = picture("c");
-    Clip* x = picture("x");
-};
+class EditSessionStructure : public ThreeInARow
+{};
 
 // Transitions
 

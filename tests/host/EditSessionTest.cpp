@@ -7,22 +7,8 @@ using namespace EditTests;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-/// Three clips in a row on the primary track.
-class EditSessionMove : public EditFixture
-{
-protected:
-    EditSessionMove()
-    {
-        lay(a, primary, 0, 1000);
-        lay(b, primary, 1000, 2000);
-        lay(c, primary, 3000, 1000);
-    }
-
-    Clip* a = picture("a");
-    Clip* b = picture("b");
-    Clip* c = picture("c");
-    Clip* x = picture("x");
-};
+class EditSessionMove : public ThreeInARow
+{};
 
 // Placing
 
@@ -625,6 +611,16 @@ TEST_F(EditSessionMove, AnIntroIsNeitherRetimedNorMovedNorOverwritten)
     done(session.addTransition(transition(), {a, b}, 600));
     done(session.extract(b));
     EXPECT_EQ(row(primary), "a 0-1000 @0, c 1000-2000 @0");
+}
+
+TEST_F(EditSessionMove, AnIntroStaysWhereItsMasterOnlyChangesTheLane)
+{
+    done(session.link(a, b));
+    b->setType(Clip::IntroVideoClip);
+    done(session.move(a, 0, extra, 0));
+    EXPECT_EQ(row(primary), "b 1000-3000 @0, c 3000-4000 @0");
+    EXPECT_EQ(row(extra), "a 0-1000 @0");
+    refused(session.move(a, 1, extra, 0), {"\"b\"", "would have to move"});
 }
 
 // Fades
