@@ -268,6 +268,10 @@ TEST_F(TimelineTracks, AreFoundByTypeInTheirOwnOrder)
     EXPECT_THAT(timeline.findTracks({QuizTrack, PrimaryTrack}), ElementsAre(c, b, a));
     EXPECT_THAT(timeline.findTracks({PrimaryTrack, PrimaryTrack}), ElementsAre(c, a));
     EXPECT_THAT(timeline.findTracks({TitleTrack, AudioTrack}), ElementsAre(d));
+    // No type is asked for, nor that of a track without a role.
+    const Track roleless;
+    timeline.addTrack(&roleless);
+    EXPECT_THAT(timeline.findTracks(TrackType(0)), ElementsAre(&roleless));
     EXPECT_THAT(timeline.findTracks({}), IsEmpty());
     EXPECT_THAT(Timeline::Object().findTracks({QuizTrack, PrimaryTrack}), IsEmpty());
 }
