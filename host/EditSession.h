@@ -75,10 +75,12 @@ enum class Ripple
 ///   transitions, the inbound one first, are limited to what is available then, and removed if they don't fit
 ///   even so. Fades are cut to the clip, the fade-out first.
 /// - No piece of a clip that a move leaves is shorter than Clip::MIN_DURATION.
-/// - Sound lies on audio tracks, and nothing else does; a track without a role takes anything.
+/// - Sound lies on audio tracks, pictures and overlays on others. A track without a role takes anything, and
+///   a clip of no single type may lie anywhere.
 ///
 /// Requests from other modules to change the timeline are granted if they leave no fault; requests to remove
-/// it are refused.
+/// it are refused. What an observer throws passes through the move, which is done then; from the destructor
+/// it ends the process. A timeline has one session at a time.
 class EditSession : private Message::View<Timeline::Object>
 {
 public:
@@ -156,7 +158,7 @@ public:
     EditResult addTrack(const Timeline::Track* track);
     /// To the place of a track of the same type.
     EditResult moveTrack(const Timeline::Track* track, const Timeline::Track* target);
-    /// With its clips, each as lift() takes it.
+    /// With its clips, each as lift() takes it; native audio goes with its track.
     EditResult removeTrack(const Timeline::Track* track);
 
     // Links
