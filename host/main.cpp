@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "Console.h"
-#include "CurveCommand.h"
-#include "DisplayText.h"
-#include "EditCommand.h"
-#include "MediaProbe.h"
-#include "NewCommand.h"
-#include "PictureCommand.h"
-#include "ProbeCommand.h"
-#include "ShowCommand.h"
+#include "host/commands/Console.h"
+#include "host/commands/CurveCommand.h"
+#include "host/commands/EditCommand.h"
+#include "host/commands/NewCommand.h"
+#include "host/commands/PictureCommand.h"
+#include "host/commands/ProbeCommand.h"
+#include "host/commands/ShowCommand.h"
+#include "host/media/MediaProbe.h"
+#include "host/text/DisplayText.h"
 
 #include <EditorModel/persistence/Document.h>
 

@@ -1,0 +1,339 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "host/editing/EditDraft.h"
+
+#include "host/editing/EditText.h"
+#include "host/editing/NativeAudio.h"
+
+#include <EditorModel/effects/Transition.h>
+
+#include <algorithm>
+#include <deque>
+#include <utility>
+
+namespace Host {
+namespace {
+
+using Timeline::Clip;
+using Timeline::ClipPair;
+using Timeline::ClipTiming;
+
+} // namespace
+
+EditDraft::EditDraft(const Timeline::Object& before) : m_timeline(before)
+{
+    for (const auto& [slave, link] : m_timeline.links) {
+        m_apart[slave] = {link.master, distance(link.master, slave)};
+    }
+}
+
+// Questions
+
+std::vector<const Clip*> EditDraft::nativeAudioOf(const Clip* master) const
+{
+    std::vector<const Clip*> found;
+    for (const auto& [slave, link] : m_timeline.links) {
+        if (link.master == master && m_timeline.isNativeAudio(slave)) {
+            found.push_back(slave);
+        }
+    }
+    return found;
+}
+
+EditDraft::Clips EditDraft::laterClips(const Lane& lane, MTime from) const
+{
+    Clips later;
+    for (const auto& [clip, timing] : m_timeline.clips) {
+        if (lane.holds(timing) && timing.timestamp >= from) {
+            later.insert(later.end(), clip);
+        }
+    }
+    return later;
+}
+
+EditDraft::Clips EditDraft::withDependants(const Clips& clips, const Clip* fixed) const
+{
+    // One walk over the links, not one for each clip: a ripple takes most of a timeline along.
+    const auto slavesOf = m_timeline.master2slaves();
+    Clips all;
+    std::deque<const Clip*> queue(clips.begin(), clips.end());
+    while (!queue.empty()) {
+        const Clip* const clip = queue.front();
+        queue.pop_front();
+        if (clip == fixed || !all.insert(clip).second) {
+            continue;
+        }
+        const auto slaves = slavesOf.find(clip);
+        if (slaves != slavesOf.end()) {
+            queue.insert(queue.end(), slaves->second.begin(), slaves->second.end());
+        }
+    }
+    return all;
+}
+
+MTime EditDraft::distance(const Clip* master, const Clip* slave) const
+{
+    return m_timeline.clipTiming(slave).timestamp - m_timeline.clipTiming(master).timestamp;
+}
+
+// Moving
+
+void EditDraft::shift(const Clips& clips, MTime delta)
+{
+    if (delta == MTime()) {
+        return;
+    }
+    for (const Clip* const clip : clips) {
+        const bool followsMaster =
+            m_timeline.isNativeAudio(clip) && clips.count(m_timeline.masterOf(clip)) != 0;
+        if (!followsMaster && !m_timeline.canEditTiming(clip)) {
+            throw EditRefused{"The " + clipText(clip) + " at " + timeText(timing(clip).timestamp) +
+                              " would have to move, but its timing can't be edited."};
+        }
+        timing(clip).timestamp += delta;
+    }
+}
+
+void EditDraft::ripple(const Lane& lane, MTime from, MTime delta, const Clip* fixed)
+{
+    shift(withDependants(laterClips(lane, from), fixed), delta);
+}
+
+// Links
+
+void EditDraft::link(const Clip* master, const Clip* slave)
+{
+    const MTime offset = distance(master, slave);
+    m_timeline.addLink(master, slave, offset);
+    m_apart[slave] = {master, offset};
+}
+
+void EditDraft::unlink(const Clip* slave)
+{
+    m_timeline.removeLink(slave);
+    m_apart.erase(slave);
+}
+
+void EditDraft::relink(const Clip* slave, const Clip* master)
+{
+    const Apart before = m_apart.at(slave);
+    const MTime now = distance(master, slave);
+    m_timeline.addLink(master, slave, m_timeline.links.at(slave).offset + now - before.distance);
+    m_apart[slave] = {master, now};
+}
+
+// Taking out
+
+void EditDraft::erase(const Clip* clip)
+{
+    // Transitions first: taking one out writes to both its clips.
+    if (const Transition::Object* const inbound = m_timeline.inboundTransitionOf(clip)) {
+        m_timeline.removeTransition(inbound);
+    }
+    if (const Transition::Object* const outbound = m_timeline.outboundTransitionOf(clip)) {
+        m_timeline.removeTransition(outbound);
+    }
+    for (const Clip* const slave : m_timeline.findSlaves(clip)) {
+        unlink(slave);
+    }
+    unlink(clip);
+    m_timeline.removeTrackingLink(clip)->clearTrackingLinks(clip)->removeClip(clip);
+    m_retimed.erase(std::remove(m_retimed.begin(), m_retimed.end(), clip), m_retimed.end());
+}
+
+void EditDraft::eraseWithNativeAudio(const Clip* clip)
+{
+    for (const Clip* const audio : nativeAudioOf(clip)) {
+        erase(audio);
+    }
+    erase(clip);
+}
+
+// Cutting
+
+const Clip* EditDraft::makeCopy(const Clip* clip)
+{
+    m_made.push_back(std::make_unique<Clip>(*clip));
+    return m_made.back().get();
+}
+
+const Clip* EditDraft::cut(const Clip* clip, MTime at)
+{
+    const Clip* const right = cutAlone(clip, at);
+    handOverSlaves(clip, right);
+    handOverFollowers(clip, right);
+    noteRetimed(clip);
+    noteRetimed(right);
+    return right;
+}
+
+const Clip* EditDraft::cutAlone(const Clip* clip, MTime at)
+{
+    const Clip* const right = makeCopy(clip);
+    ClipTiming& leftTiming = timing(clip);
+    ClipTiming rightTiming = leftTiming;
+    rightTiming.resizeLeft(at - leftTiming.timestamp).setTransitionIn(0).setFadeInDuration(0);
+    leftTiming.resizeRight(at - leftTiming.end()).setTransitionOut(0).setFadeOutDuration(0);
+    m_timeline.addClip(right, rightTiming);
+
+    if (const Transition::Object* const outbound = m_timeline.outboundTransitionOf(clip)) {
+        m_timeline.transitions.at(outbound).first = right;
+    }
+    if (const Clip* const master = m_timeline.masterOf(clip)) {
+        m_timeline.addLink(master, right, m_timeline.links.at(clip).offset);
+        m_apart[right] = m_apart.at(clip);
+        relink(right, master);
+    }
+    if (const Timeline::TrackingLinkInfo* const followed = m_timeline.getTrackingLink(clip)) {
+        m_timeline.addTrackingLink(right, Timeline::TrackingLinkInfo(*followed));
+    }
+    return right;
+}
+
+void EditDraft::handOverSlaves(const Clip* left, const Clip* right)
+{
+    const MTime at = timing(right).timestamp;
+    for (const Clip* const slave : m_timeline.findSlaves(left)) {
+        if (timing(slave).timestamp >= at) {
+            relink(slave, right);
+        } else if (m_timeline.isNativeAudio(slave) && timing(slave).end() > at) {
+            relink(cutAlone(slave, at), right);
+        }
+    }
+}
+
+void EditDraft::handOverFollowers(const Clip* left, const Clip* right)
+{
+    const MTime at = timing(right).timestamp;
+    for (auto& [follower, info] : m_timeline.trackingLinks) {
+        if (info.trackedObject.clip == left && timing(follower).timestamp >= at) {
+            info.trackedObject.clip = right;
+        }
+    }
+}
+
+void EditDraft::cutHead(const Clip* clip, MTime newStart)
+{
+    if (const Transition::Object* const inbound = m_timeline.inboundTransitionOf(clip)) {
+        m_timeline.removeTransition(inbound);
+    }
+    ClipTiming& cutTiming = timing(clip);
+    cutTiming.resizeLeft(newStart - cutTiming.timestamp).setFadeInDuration(0);
+    noteRetimed(clip);
+}
+
+void EditDraft::cutTail(const Clip* clip, MTime newEnd)
+{
+    if (const Transition::Object* const outbound = m_timeline.outboundTransitionOf(clip)) {
+        m_timeline.removeTransition(outbound);
+    }
+    ClipTiming& cutTiming = timing(clip);
+    cutTiming.resizeRight(newEnd - cutTiming.end()).setFadeOutDuration(0);
+    noteRetimed(clip);
+}
+
+void EditDraft::addNativeAudio(const Clip* master, const Clip* audio)
+{
+    ClipTiming audioTiming;
+    audioTiming.track = m_timeline.nativeAudioTrack();
+    const ClipTiming& masterTiming = timing(master);
+    if (!followMaster(master, masterTiming, audio, audioTiming)) {
+        throw EditRefused{"The " + clipText(audio) + " has nothing to play for what the " + clipText(master) +
+                          " shows at " + timeText(masterTiming.timestamp) + "."};
+    }
+    m_timeline.addClip(audio, audioTiming);
+    link(master, audio);
+}
+
+// Following up
+
+void EditDraft::finish()
+{
+    retimeNativeAudio();
+    limitFades();
+    limitTransitions();
+    updateOffsets();
+}
+
+void EditDraft::retimeNativeAudio()
+{
+    const std::vector<const Clip*> masters = m_retimed;
+    for (const Clip* const master : masters) {
+        for (const Clip* const audio : nativeAudioOf(master)) {
+            if (followMaster(master, timing(master), audio, timing(audio))) {
+                noteRetimed(audio);
+            } else {
+                erase(audio);
+            }
+        }
+    }
+}
+
+void EditDraft::limitFades()
+{
+    for (const Clip* const clip : m_retimed) {
+        ClipTiming& limited = timing(clip);
+        limited.fadeInDuration = std::min(limited.fadeInDuration, limited.duration);
+        limited.fadeOutDuration =
+            std::min(limited.fadeOutDuration, limited.duration - limited.fadeInDuration);
+    }
+}
+
+void EditDraft::limitTransitions()
+{
+    std::vector<const Transition::Object*> parted;
+    for (const auto& [transition, pair] : m_timeline.transitions) {
+        const auto& [first, second] = pair;
+        if (first && second && !timing(first).placedSequentially(timing(second))) {
+            parted.push_back(transition);
+        }
+    }
+    for (const Transition::Object* const transition : parted) {
+        m_timeline.removeTransition(transition);
+    }
+    for (const Clip* const clip : m_retimed) {
+        limitTransition(m_timeline.inboundTransitionOf(clip));
+        limitTransition(m_timeline.outboundTransitionOf(clip));
+    }
+}
+
+void EditDraft::limitTransition(const Transition::Object* transition)
+{
+    if (!transition) {
+        return;
+    }
+    const ClipPair pair = m_timeline.transitionClipPair(transition);
+    const MTime present = m_timeline.transitionRange(transition).length();
+    m_timeline.setTransitionDuration(transition, fittingLength(m_timeline, transition, pair, present));
+    if (!hasRoomForTransitions(m_timeline, pair.first) || !hasRoomForTransitions(m_timeline, pair.second)) {
+        m_timeline.removeTransition(transition);
+    }
+}
+
+void EditDraft::updateOffsets()
+{
+    for (auto& [slave, link] : m_timeline.links) {
+        link.offset += distance(link.master, slave) - m_apart.at(slave).distance;
+    }
+}
+
+// Lengths of transitions
+
+MTime fittingLength(const Timeline::Object& timeline, const Transition::Object* transition,
+                    const ClipPair& pair, MTime wish)
+{
+    const MTime standard = transition->defaultDuration;
+    const MTime expected = timeline.expectedTransitionDuration(pair, standard, wish);
+    const MTime available = timeline.availableTransitionDuration(pair);
+    return expected <= available ? expected : timeline.expectedTransitionDuration(pair, standard, available);
+}
+
+bool hasRoomForTransitions(const Timeline::Object& timeline, const Clip* clip)
+{
+    if (!clip) {
+        return true;
+    }
+    const ClipTiming& timing = timeline.clipTiming(clip);
+    return timing.transitionIn + timing.transitionOut <= timing.duration;
+}
+
+} // namespace Host

@@ -1,0 +1,369 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "Command.h"
+#include "tests/host/shared/Samples.h"
+
+#include "host/project/TimelineDocument.h"
+#include "host/timeline/TimelineOutline.h"
+
+#include <EditorModel/effects/Transition.h>
+#include <EditorModel/media/File.h>
+
+#include <QFileInfo>
+
+#include <gmock/gmock.h>
+
+#include <algorithm>
+
+namespace {
+
+using namespace HostTests;
+using Host::TimelineDocument;
+using Host::TimelineOutline;
+using testing::AllOf;
+using testing::EndsWith;
+using testing::HasSubstr;
+using testing::IsEmpty;
+using testing::StartsWith;
+using Timeline::Clip;
+using Timeline::ClipTiming;
+
+/// A project of a film of 2 s with its sound, a picture, a longer film with its sound, which begins at 6 s
+/// and lasts 4 s, and speech of 1.5 s. The clips have the numbers 1 to 3, their sounds 4 and 5, the speech 6.
+class Project
+{
+public:
+    Project()
+    {
+        const Outcome made = editormodel(
+            {"new", path(), "--media", "film.mp4", "picture.png", "long.mkv", "speech.wav"}, sample(""));
+        EXPECT_EQ(made.exitCode, 0);
+        EXPECT_THAT(made.errors, IsEmpty());
+        EXPECT_THAT(made.output, IsEmpty());
+    }
+
+    QString path() const { return m_folder.path("film.json"); }
+
+    Outcome edit(const QString& words) const
+    {
+        return editormodel(QStringList({"edit", path()}) + words.split(' '), sample(""));
+    }
+
+    /// The edit must succeed.
+    TimelineDocument edited(const QString& words) const
+    {
+        const Outcome outcome = edit(words);
+        EXPECT_EQ(outcome.exitCode, 0) << words.toStdString();
+        EXPECT_THAT(outcome.errors, IsEmpty());
+        EXPECT_THAT(outcome.output, IsEmpty());
+        return TimelineDocument::load(path());
+    }
+
+private:
+    const Folder m_folder;
+};
+
+const Clip* clipAt(const TimelineDocument& document, int number)
+{
+    return TimelineOutline(document.timeline()).clips().at(static_cast<std::size_t>(number) - 1);
+}
+
+const ClipTiming& timingAt(const TimelineDocument& document, int number)
+{
+    return document.timeline().clipTiming(clipAt(document, number));
+}
+
+TEST(NewCommand, LaysMediaOneAfterAnother)
+{
+    const Project project;
+    const TimelineDocument document = TimelineDocument::load(project.path());
+    const Timeline::Object& timeline = document.timeline();
+    const TimelineOutline outline(timeline);
+    ASSERT_EQ(outline.clips().size(), 6u);
+    const std::tuple<const char*, Clip::ClipType, TrackType, qint64, qint64> expected[] = {
+        {"film.mp4", Clip::VideoClip, PrimaryTrack, 0, 2000},
+        {"picture.png", Clip::VideoClip, PrimaryTrack, 2000, 4000},
+        {"long.mkv", Clip::VideoClip, PrimaryTrack, 6000, 4000},
+        {"film.mp4", Clip::AudioClip, NativeAudioTrack, 0, 2000},
+        {"long.mkv", Clip::AudioClip, NativeAudioTrack, 6000, 4000},
+        {"speech.wav", Clip::AudioClip, AudioTrack, 0, 1500},
+    };
+    for (std::size_t i = 0; i != outline.clips().size(); ++i) {
+        const auto& [name, type, track, start, length] = expected[i];
+        const Clip* const clip = outline.clips()[i];
+        const ClipTiming& timing = timeline.clipTiming(clip);
+        EXPECT_EQ(clip->name, name);
+        EXPECT_EQ(clip->type, type);
+        EXPECT_EQ(clip->timeline, &timeline);
+        EXPECT_EQ(clip->sourceDuration, MTime(length));
+        EXPECT_EQ(QFileInfo(clip->file->path), QFileInfo(sample(name)));
+        EXPECT_TRUE(QFileInfo(clip->file->path).isAbsolute());
+        EXPECT_EQ(timing.track->type, track);
+        EXPECT_EQ(timing.timestamp, MTime(start)) << name;
+        EXPECT_EQ(timing.duration, MTime(length)) << name;
+    }
+    EXPECT_EQ(timeline.masterOf(clipAt(document, 4)), clipAt(document, 1));
+    EXPECT_EQ(timeline.masterOf(clipAt(document, 5)), clipAt(document, 3));
+    EXPECT_EQ(clipAt(document, 4)->mediaTrack, 1);
+    EXPECT_EQ(timeline.links.size(), 2u);
+    for (const Timeline::Track* track : timeline.tracks) {
+        EXPECT_EQ(track->timeline, &timeline);
+    }
+}
+
+TEST(NewCommand, TakesCoverArtForNoPicture)
+{
+    const Folder folder;
+    ASSERT_EQ(editormodel({"new", folder.path("a.xml"), "--media", sample("song.mp3")}).exitCode, 0);
+    const TimelineDocument document = TimelineDocument::load(folder.path("a.xml"));
+    ASSERT_EQ(document.timeline().clips.size(), 1u);
+    EXPECT_EQ(clipAt(document, 1)->type, Clip::AudioClip);
+    EXPECT_EQ(timingAt(document, 1).track->type, AudioTrack);
+}
+
+TEST(NewCommand, TellsOfEachFileThatItCannotTakeAndMakesNoProjectThen)
+{
+    const Folder folder;
+    folder.copy("film.mp4", "cut.mp4", 0.5);
+    folder.copy("speech.wav", "good.wav");
+    const Outcome outcome =
+        editormodel({"new", "a.bin", "--media", "good.wav", "missing.mp4", "cut.mp4", "."}, folder.path());
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_EQ(outcome.errors, "missing.mp4: does not exist\n"
+                              "cut.mp4: looks like QuickTime / MOV but is damaged or incomplete\n"
+                              ".: is a folder\n");
+    EXPECT_FALSE(QFile::exists(folder.path("a.bin")));
+}
+
+TEST(NewCommand, ReplacesNoFile)
+{
+    const Folder folder;
+    folder.write("a.json", "precious");
+    const Outcome outcome = editormodel({"new", "a.json", "--media", sample("speech.wav")}, folder.path());
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_EQ(outcome.errors, "a.json: exists already\n");
+    EXPECT_EQ(contentOf(folder.path("a.json")), "precious");
+    EXPECT_EQ(editormodel({"new", "a.doc", "--media", sample("speech.wav")}).exitCode, 2);
+    EXPECT_EQ(editormodel({"new", "b.json"}).exitCode, 2);
+    const Outcome unwritten = editormodel({"new", "/no/such/folder/a.json", "--media", sample("speech.wav")});
+    EXPECT_EQ(unwritten.exitCode, 1);
+    EXPECT_THAT(unwritten.errors, HasSubstr("/no/such/folder/a.json"));
+}
+
+TEST(EditCommand, AddsFiles)
+{
+    const Project project;
+    const TimelineDocument appended = project.edited("add speech.wav");
+    EXPECT_EQ(timingAt(appended, 7).timestamp, MTime(1500));
+    // The clips behind make room, with their sound.
+    const TimelineDocument inserted = project.edited("add film.mp4 2");
+    EXPECT_EQ(clipAt(inserted, 2)->name, "film.mp4");
+    EXPECT_EQ(timingAt(inserted, 2).timestamp, MTime(2000));
+    EXPECT_EQ(timingAt(inserted, 3).timestamp, MTime(4000));
+    EXPECT_EQ(timingAt(inserted, 4).timestamp, MTime(8000));
+    EXPECT_EQ(timingAt(inserted, 7).timestamp, MTime(8000));
+}
+
+TEST(EditCommand, MovesClips)
+{
+    const Project project;
+    const TimelineDocument moved = project.edited("move long.mkv 7.5");
+    EXPECT_EQ(timingAt(moved, 3).timestamp, MTime(7500));
+    EXPECT_EQ(timingAt(moved, 5).timestamp, MTime(7500));
+    const TimelineDocument raised = project.edited("move 6 0:03 3 1");
+    EXPECT_EQ(timingAt(raised, 6).timestamp, MTime(3000));
+    EXPECT_EQ(timingAt(raised, 6).trackLevel, 1);
+}
+
+TEST(EditCommand, TrimsClipsToATime)
+{
+    const Project project;
+    const TimelineDocument right = project.edited("trim-right film.mp4 1.25");
+    EXPECT_EQ(timingAt(right, 1).duration, MTime(1250));
+    EXPECT_EQ(timingAt(right, 4).duration, MTime(1250));
+    EXPECT_EQ(timingAt(right, 2).timestamp, MTime(2000));
+    const TimelineDocument left = project.edited("trim-left 3 0:00:07");
+    EXPECT_EQ(timingAt(left, 3).timestamp, MTime(7000));
+    EXPECT_EQ(timingAt(left, 3).sourcePosition, MTime(1000));
+    EXPECT_EQ(timingAt(left, 3).duration, MTime(3000));
+    const TimelineDocument rippled = project.edited("trim-right 2 5000ms ripple");
+    EXPECT_EQ(timingAt(rippled, 2).duration, MTime(3000));
+    EXPECT_EQ(timingAt(rippled, 3).timestamp, MTime(6000));
+}
+
+TEST(EditCommand, SplitsClips)
+{
+    const Project project;
+    const TimelineDocument document = project.edited("split long.mkv 7.5");
+    ASSERT_EQ(document.timeline().clips.size(), 8u);
+    EXPECT_EQ(timingAt(document, 3).end(), MTime(7500));
+    EXPECT_EQ(timingAt(document, 4).timestamp, MTime(7500));
+    EXPECT_EQ(timingAt(document, 4).end(), MTime(10000));
+    EXPECT_EQ(timingAt(document, 4).sourcePosition, MTime(1500));
+    EXPECT_EQ(document.timeline().masterOf(clipAt(document, 7)), clipAt(document, 4));
+}
+
+TEST(EditCommand, ChangesSpeedAndDirection)
+{
+    const Project project;
+    const TimelineDocument document = project.edited("speed 3 2 then reverse 3");
+    EXPECT_EQ(timingAt(document, 3).duration, MTime(2000));
+    EXPECT_TRUE(timingAt(document, 3).reversed);
+    EXPECT_DOUBLE_EQ(document.timeline().clipSpeed(clipAt(document, 3)), 2.0);
+}
+
+TEST(EditCommand, SetsFades)
+{
+    const Project project;
+    const TimelineDocument document = project.edited("fade-in speech.wav 0.5 , fade-out speech.wav 250ms");
+    EXPECT_EQ(timingAt(document, 6).fadeInDuration, MTime(500));
+    EXPECT_EQ(timingAt(document, 6).fadeOutDuration, MTime(250));
+}
+
+TEST(EditCommand, AddsAndRemovesTransitions)
+{
+    const Project project;
+    const TimelineDocument between = project.edited("transition add 1 2 1 wipe");
+    const Transition::Object* const wipe =
+        between.timeline().transitionOf(clipAt(between, 1), clipAt(between, 2));
+    ASSERT_TRUE(wipe);
+    EXPECT_EQ(wipe->tag, "wipe");
+    EXPECT_EQ(timingAt(between, 1).transitionOut, MTime(500));
+    EXPECT_EQ(timingAt(between, 2).transitionIn, MTime(500));
+    // A transition of one clip takes half of the default of two seconds.
+    const TimelineDocument into = project.edited("transition add - 1 then transition add 3 -");
+    EXPECT_EQ(timingAt(into, 1).transitionIn, MTime(1000));
+    EXPECT_EQ(timingAt(into, 3).transitionOut, MTime(1000));
+    EXPECT_EQ(into.timeline().transitions.size(), 3u);
+    const TimelineDocument removed = project.edited("transition remove 1 then transition remove 3");
+    ASSERT_EQ(removed.timeline().transitions.size(), 1u);
+    EXPECT_EQ(removed.timeline().transitions.begin()->first->tag, "wipe");
+}
+
+TEST(EditCommand, AddsMovesAndRemovesTracks)
+{
+    const Project project;
+    const TimelineDocument added = project.edited("track add audio then track add extra-video");
+    ASSERT_EQ(added.timeline().tracks.size(), 5u);
+    EXPECT_EQ(added.timeline().tracks[3]->type, AudioTrack);
+    EXPECT_EQ(added.timeline().tracks[4]->type, ExtraVideoTrack);
+    const TimelineDocument moved = project.edited("track move 4 3");
+    EXPECT_TRUE(moved.timeline().isTrackEmpty(moved.timeline().tracks[2]));
+    EXPECT_FALSE(moved.timeline().isTrackEmpty(moved.timeline().tracks[3]));
+    const TimelineDocument removed = project.edited("track remove 4");
+    EXPECT_EQ(removed.timeline().tracks.size(), 4u);
+    EXPECT_EQ(removed.timeline().clips.size(), 5u);
+}
+
+TEST(EditCommand, LinksAndUnlinksClips)
+{
+    const Project project;
+    const TimelineDocument linked = project.edited("link 3 6");
+    EXPECT_EQ(linked.timeline().masterOf(clipAt(linked, 6)), clipAt(linked, 3));
+    const TimelineDocument unlinked = project.edited("unlink 6");
+    EXPECT_FALSE(unlinked.timeline().isSlave(clipAt(unlinked, 6)));
+}
+
+TEST(EditCommand, DeletesClips)
+{
+    const Project project;
+    const TimelineDocument lifted = project.edited("delete film.mp4");
+    ASSERT_EQ(lifted.timeline().clips.size(), 4u);
+    EXPECT_EQ(timingAt(lifted, 1).timestamp, MTime(2000));
+    const TimelineDocument extracted = project.edited("extract picture.png");
+    EXPECT_EQ(clipAt(extracted, 1)->name, "long.mkv");
+    EXPECT_EQ(timingAt(extracted, 1).timestamp, MTime(2000));
+}
+
+TEST(EditCommand, NumbersWhatItMakesBehindWhatTheDocumentHad)
+{
+    const Project project;
+    // The right part and its sound are 7 and 8; the numbers of the others stay.
+    const TimelineDocument document =
+        project.edited("split 3 8 then delete 1 then delete 7 then fade-in 6 1");
+    EXPECT_EQ(document.timeline().clips.size(), 4u);
+    EXPECT_EQ(document.timeline().duration(), MTime(8000));
+}
+
+TEST(EditCommand, RefusesInOneLineAndLeavesTheDocumentAsItIs)
+{
+    const Project project;
+    const QByteArray before = contentOf(project.path());
+    const std::pair<const char*, const char*> wrong[] = {
+        {"split 3 5", "split 3 5: "},
+        {"split 3 6.005", "split 3 6.005: "},
+        {"trim-right 1 3", "trim-right 1 3: "},
+        {"trim-left 4 1", "trim-left 4 1: "},
+        {"move 1 3", "move 1 3: "},
+        {"speed 1 0", "speed 1 0: "},
+        {"speed 1 fast", "speed 1 fast: \"fast\" is no speed: 2 and 0.5 are\n"},
+        {"fade-in 6 2", "fade-in 6 2: "},
+        {"transition add 1 3", "transition add 1 3: "},
+        {"transition add 1 2 0", "transition add 1 2 0: \"0\" is no length of a transition\n"},
+        {"transition remove 1", "transition remove 1: there is no transition \"1\"\n"},
+        {"track move 1 2", "track move 1 2: "},
+        {"track add fish", "track add fish: \"fish\" is no role of a track: "},
+        {"track remove 9", "track remove 9: there is no track \"9\"\n"},
+        {"link 1 1", "link 1 1: "},
+        {"delete 0", "delete 0: there is no clip \"0\"\n"},
+        {"delete nobody", "delete nobody: there is no clip \"nobody\"\n"},
+        {"split 1 noon", "split 1 noon: \"noon\" is no time: 1:02.5, 62.5 and 62500ms are\n"},
+        {"move 1 3 1 high", "move 1 3 1 high: \"high\" is no level\n"},
+        {"trim-right 1 1 gently", "trim-right 1 1 gently: \"gently\" is not understood: \"ripple\" may"},
+        {"split 1", "split 1: lacks a word\n"},
+        {"reverse 1 2", "reverse 1 2: has a word too many\n"},
+        {"frobnicate 1", "frobnicate 1: is no edit; "},
+        {"add nobody.mp4", "add nobody.mp4: nobody.mp4 does not exist\n"},
+        {"delete 1 then delete 1", "delete 1: there is no clip \"1\"\n"},
+        {"delete 6 then split 1 9", "split 1 9: "},
+        {"delete 6 then", "\"\": is no edit; "},
+    };
+    for (const auto& [words, error] : wrong) {
+        const Outcome outcome = project.edit(words);
+        EXPECT_EQ(outcome.exitCode, 1) << words;
+        EXPECT_THAT(outcome.output, IsEmpty()) << words;
+        EXPECT_THAT(outcome.errors, AllOf(StartsWith(error), EndsWith("\n")));
+        EXPECT_EQ(std::count(outcome.errors.begin(), outcome.errors.end(), '\n'), 1) << outcome.errors;
+        EXPECT_EQ(contentOf(project.path()), before) << words;
+    }
+    project.edited("add speech.wav");
+    EXPECT_EQ(project.edit("delete speech.wav").errors,
+              "delete speech.wav: there are several clips \"speech.wav\": give the number of one\n");
+}
+
+TEST(EditCommand, TellsInOneLineThatThereIsNoTimeline)
+{
+    const Folder folder;
+    const Media::File file;
+    Document::saveFile(folder.path("file.json"), {&file}, Document::Json, Document::Stream);
+    folder.write("letter.json", "Dear Sir or Madam,\n");
+    for (const auto& [name, error] : {std::pair("missing.json", "missing.json: does not exist\n"),
+                                      std::pair("letter.json", "letter.json: "),
+                                      std::pair("file.json", "file.json: holds no timeline, but File\n")}) {
+        const Outcome outcome = editormodel({"edit", name, "delete", "1"}, folder.path());
+        EXPECT_EQ(outcome.exitCode, 1);
+        EXPECT_THAT(outcome.errors, StartsWith(error));
+        EXPECT_EQ(std::count(outcome.errors.begin(), outcome.errors.end(), '\n'), 1) << outcome.errors;
+    }
+    EXPECT_EQ(editormodel({"edit", "a.json"}).exitCode, 2);
+    EXPECT_THAT(editormodel({"edit", "--help"}).output,
+                AllOf(HasSubstr("split CLIP TIME"), HasSubstr("transition add"), EndsWith("\n")));
+}
+
+TEST(EditCommand, KeepsWhatElseTheDocumentHolds)
+{
+    const Project project;
+    const Folder folder;
+    Media::File file;
+    file.setPath("other.wav");
+    const TimelineDocument document = TimelineDocument::load(project.path());
+    Document::saveFile(folder.path("both.bin"), {&file, &document.timeline()}, Document::Binary,
+                       Document::Stream);
+    ASSERT_EQ(editormodel({"edit", folder.path("both.bin"), "delete", "6"}).exitCode, 0);
+    const Document::Graph graph = Document::loadFile(folder.path("both.bin"), Document::ForeignDocuments);
+    ASSERT_EQ(graph.roots().size(), 2u);
+    ASSERT_TRUE(graph.rootAs<Media::File>());
+    EXPECT_EQ(graph.rootAs<Media::File>()->path, "other.wav");
+    EXPECT_EQ(Host::timelineOf(graph)->clips.size(), 5u);
+}
+
+} // namespace
