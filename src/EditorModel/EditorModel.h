@@ -28,7 +28,11 @@
 #include <EditorModel/effects/TransformationPreset.h>
 #include <EditorModel/effects/Transition.h>
 #include <EditorModel/effects/Views.h>
+#include <EditorModel/library/CollectionIds.h>
 #include <EditorModel/library/EditorCollection.h>
+#include <EditorModel/library/Indication.h>
+#include <EditorModel/library/Project.h>
+#include <EditorModel/library/UserObject.h>
 #include <EditorModel/media/Audio.h>
 #include <EditorModel/media/File.h>
 #include <EditorModel/media/FileAnalyzer.h>

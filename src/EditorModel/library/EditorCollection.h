@@ -3,6 +3,8 @@
 
 #include <EditorModel/Export.h>
 #include <EditorModel/bus/PubSub.h>
+#include <EditorModel/library/CollectionIds.h>
+#include <EditorModel/library/UserObject.h>
 
 namespace EditorCollection {
 
