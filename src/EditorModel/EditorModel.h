@@ -10,6 +10,9 @@
 #include <EditorModel/analysis/MotionTracking.h>
 #include <EditorModel/analysis/SceneDetection.h>
 #include <EditorModel/analysis/Stabilization.h>
+#include <EditorModel/analysis/TrackingData.h>
+#include <EditorModel/analysis/TrackingHelper.h>
+#include <EditorModel/analysis/TrackingTask.h>
 #include <EditorModel/bus/Messages.h>
 #include <EditorModel/bus/Preview.h>
 #include <EditorModel/bus/PubSub.h>
@@ -35,6 +38,7 @@
 #include <EditorModel/library/UserObject.h>
 #include <EditorModel/media/Audio.h>
 #include <EditorModel/media/File.h>
+#include <EditorModel/media/FileAdder.h>
 #include <EditorModel/media/FileAnalyzer.h>
 #include <EditorModel/media/FileTarget.h>
 #include <EditorModel/media/Media.h>
@@ -61,6 +65,7 @@
 #include <EditorModel/services/Task.h>
 #include <EditorModel/services/Tutorial.h>
 #include <EditorModel/timeline/Clip.h>
+#include <EditorModel/timeline/ClipBuildingStrategy.h>
 #include <EditorModel/timeline/ClipOrder.h>
 #include <EditorModel/timeline/ClipTiming.h>
 #include <EditorModel/timeline/Composition.h>

@@ -1,16 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
-#include <EditorModel/analysis/MotionTracking.h>
+#include <EditorModel/analysis/TrackingHelper.h>
 
 #include <QScopeGuard>
 
 #include <utility>
 
 namespace MotionTracking {
-
-Data::Data(const QString& id_) : id(id_) {}
-
-Data::~Data() = default;
-
 namespace Details {
 
 LoadTrackingNotification::LoadTrackingNotification(const MotionTracking::Data* about,
