@@ -47,6 +47,7 @@
 #include <EditorModel/library/PackageContent.h>
 #include <EditorModel/library/PackageFetcher.h>
 #include <EditorModel/library/PackageStorage.h>
+#include <EditorModel/library/PersistentItem.h>
 #include <EditorModel/library/Project.h>
 #include <EditorModel/library/UserObject.h>
 #include <EditorModel/media/Audio.h>
