@@ -1,13 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/library/PersistentItem.h>
 
-#include <EditorModel/effects/Effect.h>
-#include <EditorModel/effects/Overlay.h>
-#include <EditorModel/effects/Quiz.h>
-#include <EditorModel/effects/Theme.h>
-#include <EditorModel/effects/TransformationPreset.h>
-#include <EditorModel/effects/Transition.h>
-#include <EditorModel/library/Import.h>
 #include <EditorModel/persistence/Fields.h>
 
 namespace EditorCollection {

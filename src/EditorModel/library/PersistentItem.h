@@ -3,6 +3,13 @@
 
 #include <EditorModel/Export.h>
 #include <EditorModel/bus/PubSub.h>
+#include <EditorModel/effects/Effect.h>
+#include <EditorModel/effects/Overlay.h>
+#include <EditorModel/effects/Quiz.h>
+#include <EditorModel/effects/Theme.h>
+#include <EditorModel/effects/TransformationPreset.h>
+#include <EditorModel/effects/Transition.h>
+#include <EditorModel/library/ImportObject.h>
 #include <EditorModel/persistence/Persistent.h>
 #include <EditorModel/types/Image.h>
 
@@ -12,27 +19,8 @@
 #include <memory>
 #include <set>
 
-namespace Effect {
-class Object;
-}
-namespace Import {
-class Object;
-}
-namespace Theme {
-class Object;
-}
-namespace Transition {
-class Object;
-}
-namespace Overlay {
-class Preset;
-}
-namespace Quiz {
-class Preset;
-}
-namespace Envelope {
-class TransformationPreset;
-}
+// The elements are included, not just declared: an instantiation is exported only where its argument is known
+// to be.
 
 namespace EditorCollection {
 

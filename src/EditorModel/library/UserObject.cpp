@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/library/UserObject.h>
 
-#include <EditorModel/library/Import.h>
+#include <EditorModel/library/ImportObject.h>
 #include <EditorModel/persistence/Fields.h>
 
 #include <algorithm>
