@@ -109,10 +109,9 @@ void checkLength(const Clip* clip, MTime start, MTime length)
     }
 }
 
-void checkStretch(const Clip* clip, const ClipTiming& timing)
+void checkStretch(const Clip* clip, const ClipTiming& timing, MTime before)
 {
-    const bool isInSource = timing.sourcePosition >= MTime() && timing.sourceEnd() <= timing.sourceDuration;
-    if (!clip->unlimitedDuration && !isInSource) {
+    if (beyondSource(clip, timing) > before) {
         throw EditRefused{"The " + clipText(clip) + at(timing.timestamp) + " would show its source from " +
                           timeText(timing.sourcePosition) + " to " + timeText(timing.sourceEnd()) +
                           ", but that lasts " + timeText(timing.sourceDuration) + "."};

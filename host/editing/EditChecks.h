@@ -18,8 +18,9 @@ void checkEditable(const Timeline::Object& timeline, const Timeline::Clip* clip)
 void checkCanSplit(const Timeline::Object& timeline, const Timeline::Clip* clip, MTime at);
 /// The length that an edit of the clip, which starts at `start`, would leave.
 void checkLength(const Timeline::Clip* clip, MTime start, MTime length);
-/// The stretch of the source that an edit of the clip would leave.
-void checkStretch(const Timeline::Clip* clip, const Timeline::ClipTiming& timing);
+/// The stretch of the source that an edit of the clip would leave. It may lie beyond the source as far as it
+/// did `before`.
+void checkStretch(const Timeline::Clip* clip, const Timeline::ClipTiming& timing, MTime before = 0);
 void checkListed(const Timeline::Object& timeline, const Timeline::Track* track);
 /// The clip may lie on the lane.
 void checkLane(const Timeline::Object& timeline, const Timeline::Clip* clip, const Lane& lane, MTime at);

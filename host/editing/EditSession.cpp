@@ -109,6 +109,15 @@ void checkRemovable(const Timeline::Object& timeline, const Clip* clip)
     }
 }
 
+/// Moves a stretch that lies beyond the source by rounding, as far as its length allows.
+void takeIntoSource(const Clip* clip, ClipTiming& timing)
+{
+    if (beyondSource(clip, timing) > MTime()) {
+        const MTime last = timing.sourceDuration - timing.duration;
+        timing.sourcePosition = std::max(MTime(), std::min(timing.sourcePosition, last));
+    }
+}
+
 /// Lets the clips behind follow a clip that has got another length.
 void follow(EditDraft& draft, const Clip* clip, const ClipTiming& before, Ripple ripple)
 {
@@ -246,7 +255,7 @@ EditResult EditSession::trimLeft(const Clip* clip, MTime delta, Ripple ripple)
             timing.setTimestamp(before.timestamp);
         }
         checkLength(clip, before.timestamp, timing.duration);
-        checkStretch(clip, timing);
+        checkStretch(clip, timing, beyondSource(clip, before));
         follow(draft, clip, before, ripple);
     });
 }
@@ -260,7 +269,7 @@ EditResult EditSession::trimRight(const Clip* clip, MTime delta, Ripple ripple)
         const ClipTiming before = timing;
         timing.resizeRight(-delta);
         checkLength(clip, before.timestamp, timing.duration);
-        checkStretch(clip, timing);
+        checkStretch(clip, timing, beyondSource(clip, before));
         follow(draft, clip, before, ripple);
     });
 }
@@ -299,10 +308,8 @@ EditResult EditSession::setSpeed(const Clip* clip, double speed, Ripple ripple)
                               QString(" can't be played at a speed of %1.").arg(speed)};
         }
         draft.timeline().setClipSpeed(clip, speed);
-        // Each time is rounded by itself, and so the stretch may reach a millisecond beyond the source.
-        if (!clip->unlimitedDuration && timing.sourceEnd() > timing.sourceDuration) {
-            timing.sourcePosition = timing.sourceDuration - timing.duration;
-        }
+        takeIntoSource(clip, timing);
+        timing.duration -= beyondSource(clip, timing);
         checkLength(clip, before.timestamp, timing.duration);
         checkStretch(clip, timing);
         follow(draft, clip, before, ripple);
@@ -314,6 +321,7 @@ EditResult EditSession::reverse(const Clip* clip)
     return edit(clip, [&](EditDraft& draft) {
         checkEditable(draft.timeline(), clip);
         draft.timeline().reverseClip(clip);
+        takeIntoSource(clip, draft.timing(clip));
         draft.noteRetimed(clip);
     });
 }

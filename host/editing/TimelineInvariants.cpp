@@ -23,16 +23,15 @@ bool isWithin(MTime time, MTime earliest)
     return earliest <= time && time <= LATEST_TIME;
 }
 
-/// Durations are a matter of their own where they are not positive.
-bool hasTimesInRange(const Clip* clip, const ClipTiming& timing)
+/// Durations are a matter of their own where they are not positive, and so is a stretch before the source.
+bool hasTimesInRange(const ClipTiming& timing)
 {
     const std::initializer_list<MTime> counts = {timing.timestamp,      timing.sourceDuration,
                                                  timing.transitionIn,   timing.transitionOut,
                                                  timing.fadeInDuration, timing.fadeOutDuration};
-    // A stretch that is bound to no source may start before it.
     return std::all_of(counts.begin(), counts.end(), [](MTime time) { return isWithin(time, 0); }) &&
-           isWithin(timing.sourcePosition, clip->unlimitedDuration ? -LATEST_TIME : MTime()) &&
-           timing.duration <= LATEST_TIME && timing.timestamp + timing.duration <= LATEST_TIME;
+           isWithin(timing.sourcePosition, -LATEST_TIME) && timing.duration <= LATEST_TIME &&
+           timing.timestamp + timing.duration <= LATEST_TIME;
 }
 
 /// A clip in its lane.
@@ -117,7 +116,7 @@ private:
 
     void findInTiming(const Clip* clip, const ClipTiming& timing)
     {
-        const bool isInRange = hasTimesInRange(clip, timing);
+        const bool isInRange = hasTimesInRange(timing);
         if (!isInRange) {
             addAbout(Kind::TimeOutOfRange, clip,
                      "has a time that is negative or later than " + timeText(LATEST_TIME) +
@@ -129,9 +128,10 @@ private:
         if (!isInRange || timing.duration <= MTime()) {
             return;
         }
-        if (!clip->unlimitedDuration && timing.sourceEnd() > timing.sourceDuration) {
+        if (beyondSource(clip, timing) > SOURCE_ROUNDING) {
             addAbout(Kind::OutsideSource, clip,
-                     "shows its source up to " + timeText(timing.sourceEnd()) + ", but that ends at " +
+                     "shows its source from " + timeText(timing.sourcePosition) + " to " +
+                         timeText(timing.sourceEnd()) + ", but that lasts " +
                          timeText(timing.sourceDuration) + ".");
         }
         if (timing.transitionIn + timing.transitionOut > timing.duration) {
@@ -283,6 +283,14 @@ private:
 };
 
 } // namespace
+
+MTime beyondSource(const Clip* clip, const ClipTiming& timing)
+{
+    if (clip->unlimitedDuration) {
+        return 0;
+    }
+    return std::max({MTime(), -timing.sourcePosition, timing.sourceEnd() - timing.sourceDuration});
+}
 
 std::vector<TimelineFault> timelineFaults(const Timeline::Object& timeline)
 {

@@ -22,7 +22,7 @@ struct TimelineFault
         NoTrack,             ///< a clip lies on a track that is not listed, or on none
         TimeOutOfRange,      ///< a time is negative or beyond LATEST_TIME
         NoDuration,          ///< a clip's duration is not positive
-        OutsideSource,       ///< a clip of limited duration shows more than there is in its source
+        OutsideSource,       ///< a clip of limited duration shows more than its source, and not by rounding
         TooLongAtEnds,       ///< the transitions, or the fades, of a clip are longer than the clip
         Overlap,             ///< a clip starts before another one on its track and level ends
         TrackListedTwice,    ///< or null is listed as a track
@@ -42,6 +42,14 @@ struct TimelineFault
     /// One sentence for people, with its full stop.
     QString text;
 };
+
+/// How far a clip shows more than there is in its source, at the end where that is more; 0 for a clip of
+/// unlimited duration. The times must be in range.
+MTime beyondSource(const Timeline::Clip* clip, const Timeline::ClipTiming& timing);
+
+/// By so much may a clip lie beyond its source: a change of speed rounds the start, the length and the source
+/// each by itself.
+constexpr MTime SOURCE_ROUNDING = 1;
 
 /// All faults, in the order of their kinds; empty for a sound timeline. Nothing but clips and tracks that are
 /// listed is looked into, and no time is too wild to be looked at. What cannot be told because of a fault of

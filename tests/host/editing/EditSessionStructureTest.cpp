@@ -189,6 +189,53 @@ TEST_F(EditSessionStructure, RequestsOfOthersAreGrantedWhereTheyLeaveNoFault)
     EXPECT_EQ(watcher.changes, 1);
 }
 
+/// 3000 ms of source from 1 on, which another module has brought to a speed of 2: the stretch of 0.5 and
+/// 1499.5 ms is rounded to 1 and 1500, and the source to 1500.
+class RoundedStretch : public EditSessionStructure
+{
+protected:
+    RoundedStretch()
+    {
+        lay(p, extra, 0, 2000);
+        watcher.change(session.timeline())
+            ->setClipSourcePosition(p, 1)
+            ->setClipDuration(p, 2999)
+            ->setClipSpeed(p, 2);
+    }
+
+    Clip* p = picture("p", 3000);
+};
+
+TEST_F(RoundedStretch, IsEditedOn)
+{
+    EXPECT_EQ(row(extra), "p 0-1500 @1");
+    EXPECT_EQ(now().clipTiming(p).sourceDuration, MTime(1500));
+    EXPECT_TRUE(session.trimLeft(p, 10));
+    EXPECT_EQ(row(extra), "p 10-1500 @11");
+    EXPECT_FALSE(session.trimRight(p, -1));
+    EXPECT_TRUE(session.split(p, 1000));
+    EXPECT_EQ(row(extra), "p 10-1000 @11, p 1000-1500 @1001");
+}
+
+TEST_F(RoundedStretch, IsTakenIntoItsSourceByReversing)
+{
+    EXPECT_TRUE(session.reverse(p));
+    // 1500 - 1500 - 1 is before the start.
+    EXPECT_EQ(row(extra), "p 0-1500 @0 rev");
+    watcher.change(session.timeline())->reverseClip(p);
+    EXPECT_EQ(row(extra), "p 0-1500 @0");
+}
+
+TEST_F(EditSessionStructure, ASpeedTakesARoundedStretchIntoItsSource)
+{
+    Clip* const p = picture("p", 3000);
+    lay(p, extra, 0, 2000);
+    watcher.change(session.timeline())->setClipDuration(p, 3001);
+    EXPECT_EQ(row(extra), "p 0-3001 @0");
+    EXPECT_TRUE(session.setSpeed(p, 0.5));
+    EXPECT_EQ(row(extra), "p 0-6000 @0");
+}
+
 TEST_F(EditSessionStructure, ATimelineIsNotTakenFromItsSession)
 {
     watcher.remove(session.timeline());

@@ -51,7 +51,9 @@ public:
     {
         m_shown = inOrder();
         auto value = watcher.change(session.timeline());
-        if (chance(2)) {
+        if (chance(3)) {
+            retime(*value.operator->(), clip());
+        } else if (chance(2)) {
             value->addTrackingLink(clip(), Timeline::TrackingLinkInfo({clip(), "face"}, QPointF()));
         } else {
             value->moveClip(clip(), wild());
@@ -86,6 +88,16 @@ private:
         add("removeTrack", 1, [this] { return session.removeTrack(chance(4) ? track() : nullptr); });
         add("link", 8, [this] { return session.link(clip(), clip()); });
         add("unlink", 3, [this] { return session.unlink(clip()); });
+    }
+
+    /// By little, and only what has no native audio, since the other module looks after nothing.
+    void retime(Timeline::Object& value, const Clip* clip)
+    {
+        const auto entry = value.clips.find(clip);
+        if (entry != value.clips.end() && !value.isNativeAudio(clip) && value.findSlaves(clip).empty() &&
+            entry->second.duration > MTime(20)) {
+            value.setClipSpeed(clip, value.clipSpeed(clip) * 1.01);
+        }
     }
 
     std::size_t number(std::size_t below) { return m_random() % below; }

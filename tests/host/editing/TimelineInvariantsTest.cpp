@@ -83,7 +83,7 @@ TEST_F(TimelineFaults, TimesAreNeitherNegativeNorTooLate)
     const ClipTiming sound = t.clipTiming(&s);
     std::vector<ClipTiming> wild(8, sound);
     wild[0].timestamp = -1;
-    wild[1].sourcePosition = -1;
+    wild[1].sourcePosition = MTime(-2147483648);
     wild[2].sourceDuration = MTime(2147483648);
     wild[3].fadeInDuration = -1;
     wild[4].fadeOutDuration = std::numeric_limits<qint64>::min();
@@ -114,11 +114,31 @@ TEST_F(TimelineFaults, TheShownStretchLiesInTheSource)
 {
     t.setClipSourcePosition(&s, 4500);
     EXPECT_THAT(kinds(), IsEmpty());
-    t.setClipSourcePosition(&s, 4501);
+    t.setClipSourcePosition(&s, 4502);
+    EXPECT_THAT(kinds(), ElementsAre(TimelineFault::OutsideSource));
+    t.setClipSourcePosition(&s, -2);
     EXPECT_THAT(kinds(), ElementsAre(TimelineFault::OutsideSource));
     s.setUnlimitedDuration(true);
     EXPECT_THAT(kinds(), IsEmpty());
     t.setClipSourcePosition(&s, -700);
+    EXPECT_THAT(kinds(), IsEmpty());
+}
+
+TEST_F(TimelineFaults, TheStretchMayLieBeyondTheSourceAsFarAsSpeedsAreRounded)
+{
+    // At twice the speed 3, 2998 and 3001 become 1.5, 1499 and 1500.5, and the halves are rounded up.
+    s.setSourceDuration(3001);
+    t.addClip(&s, ClipTiming(&title, 0, 1200, 2998, 3, 3001))->setClipSpeed(&s, 2);
+    EXPECT_EQ(t.clipTiming(&s).sourceEnd(), MTime(1501));
+    EXPECT_EQ(t.clipTiming(&s).sourceDuration, MTime(1501));
+    // 1, 2999 and 3000: 0.5, 1499.5 and 1500.
+    s.setSourceDuration(3000);
+    t.addClip(&s, ClipTiming(&title, 0, 1200, 2999, 1, 3000))->setClipSpeed(&s, 2);
+    EXPECT_EQ(t.clipTiming(&s).sourceEnd(), MTime(1501));
+    EXPECT_EQ(t.clipTiming(&s).sourceDuration, MTime(1500));
+    EXPECT_THAT(kinds(), IsEmpty());
+    t.reverseClip(&s);
+    EXPECT_EQ(t.clipTiming(&s).sourcePosition, MTime(-1));
     EXPECT_THAT(kinds(), IsEmpty());
 }
 
