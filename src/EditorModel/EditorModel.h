@@ -83,6 +83,8 @@
 #include <EditorModel/timeline/ClipOrder.h>
 #include <EditorModel/timeline/ClipTiming.h>
 #include <EditorModel/timeline/Composition.h>
+#include <EditorModel/timeline/Editor.h>
+#include <EditorModel/timeline/Film.h>
 #include <EditorModel/timeline/Label.h>
 #include <EditorModel/timeline/Link.h>
 #include <EditorModel/timeline/Object.h>
