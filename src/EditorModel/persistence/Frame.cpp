@@ -32,6 +32,30 @@ QByteArray digest(const QByteArray& content)
     throw std::runtime_error("it is damaged: its content does not fit its checksum");
 }
 
+/// The bytes from `from` to before `to`, which stay the document's: whole documents aren't copied.
+QByteArray part(const QByteArray& document, int from, int to)
+{
+    return QByteArray::fromRawData(document.constData() + from, to - from);
+}
+
+QByteArray sealOf(const QByteArray& content)
+{
+    return sealBegin + QByteArray::number(content.size()) + sealMiddle + digest(content).toHex() + sealEnd;
+}
+
+bool isBlank(char c)
+{
+    return c == ' ' || (c >= '\t' && c <= '\r');
+}
+
+bool endsWithEndTag(const QByteArray& content)
+{
+    int end = content.size();
+    while (end > 0 && isBlank(content[end - 1]))
+        --end;
+    return part(content, 0, end).endsWith("</boost_serialization>");
+}
+
 void checkLength(qint64 expected, qint64 found)
 {
     if (expected > found)
@@ -77,17 +101,16 @@ Unframed unframed(const QByteArray& document)
     if (route != Archive && route != Stream)
         throwDamaged();
     const auto length = qFromLittleEndian<qint64>(document.constData() + lengthOffset);
-    const QByteArray content = document.mid(contentOffset);
+    const QByteArray content = part(document, contentOffset, document.size());
     checkLength(length, content.size());
     if (digest(content) != document.mid(digestOffset, digestLength))
         throwDamaged();
     return {static_cast<Route>(route), content};
 }
 
-QByteArray sealed(const QByteArray& content)
+QByteArray sealed(QByteArray content)
 {
-    return content + sealBegin + QByteArray::number(content.size()) + sealMiddle + digest(content).toHex() +
-           sealEnd;
+    return content += sealOf(content);
 }
 
 QByteArray unsealed(const QByteArray& document)
@@ -95,12 +118,12 @@ QByteArray unsealed(const QByteArray& document)
     const int seal = document.lastIndexOf(sealBegin);
     if (seal < 0)
         throw std::runtime_error("it is cut off: the line that closes an archive is missing");
-    const QByteArray content = document.left(seal);
+    const QByteArray content = part(document, 0, seal);
     // Written anew, the seal must be the same to the last byte.
-    if (sealed(content) != document)
+    if (sealOf(content) != part(document, seal, document.size()))
         throwDamaged();
     // The archive's reader ends the process where the end tag is missing.
-    if (!content.trimmed().endsWith("</boost_serialization>"))
+    if (!endsWithEndTag(content))
         throw std::runtime_error("it is cut off: its end tag is missing");
     return content;
 }

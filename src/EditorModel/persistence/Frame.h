@@ -18,13 +18,15 @@ QByteArray framed(const QByteArray& content, Route route);
 struct Unframed
 {
     Route route;
+    /// The document's own bytes: it must outlive them.
     QByteArray content;
 };
 Unframed unframed(const QByteArray& document);
 bool hasFrame(const QByteArray& document);
 
 /// An XML archive: the content, and a comment behind it with its length and digest.
-QByteArray sealed(const QByteArray& content);
+QByteArray sealed(QByteArray content);
+/// The document's own bytes: it must outlive them.
 QByteArray unsealed(const QByteArray& document);
 /// The document begins as an archive does, sealed or not.
 bool isXmlArchive(const QByteArray& document);
