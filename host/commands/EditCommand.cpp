@@ -3,7 +3,7 @@
 
 #include "host/commands/Refusal.h"
 #include "host/editing/EditScript.h"
-#include "host/project/TimelineDocument.h"
+#include "host/project/ProjectDocument.h"
 
 namespace Host {
 namespace {
@@ -49,7 +49,7 @@ With ripple the clips behind follow.
 ExitCode editProject(const QString& path, const QStringList& words)
 {
     return unlessRefused([&] {
-        const TimelineDocument document = TimelineDocument::load(path);
+        const ProjectDocument document = ProjectDocument::load(path);
         EditSession session(&document.timeline());
         EditScript script(session);
         for (const QStringList& command : commandsOf(words)) {

@@ -3,7 +3,10 @@
 
 #include "host/commands/Refusal.h"
 #include "host/media/MediaClips.h"
-#include "host/project/TimelineDocument.h"
+#include "host/project/ProjectStore.h"
+
+#include <EditorModel/library/UserObject.h>
+#include <EditorModel/media/ResourceTable.h>
 
 #include <QFileInfo>
 
@@ -26,6 +29,18 @@ bool layAll(EditSession& session, MediaClips& clips, const QStringList& media)
     return isDone;
 }
 
+/// With a collection and a table for what is to come.
+void saveProject(Timeline::Object& timeline, const QString& path)
+{
+    EditorCollection::UserObject collection;
+    ResourceTable::Object table;
+    Project::Content content;
+    content.timeline = &timeline;
+    content.userCollection = &collection;
+    content.resourceTable = &table;
+    ProjectStore::save(content, path);
+}
+
 } // namespace
 
 ExitCode newProject(const QString& path, const QStringList& media)
@@ -34,12 +49,13 @@ ExitCode newProject(const QString& path, const QStringList& media)
         if (QFileInfo::exists(path)) {
             throw Refusal(path, "exists already");
         }
-        EditSession session;
+        Timeline::Object timeline;
+        EditSession session(&timeline);
         MediaClips clips(session);
         if (!layAll(session, clips, media)) {
             return Failure;
         }
-        TimelineDocument::save(*session.timeline(), path);
+        saveProject(timeline, path);
         return Success;
     });
 }

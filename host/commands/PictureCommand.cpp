@@ -2,7 +2,7 @@
 #include "host/commands/PictureCommand.h"
 
 #include "host/commands/Refusal.h"
-#include "host/project/TimelineDocument.h"
+#include "host/project/ProjectDocument.h"
 #include "host/timeline/TimelinePicture.h"
 
 #include <QFileInfo>
@@ -13,7 +13,7 @@ ExitCode drawTimeline(const QString& document, const QString& picturePath)
 {
     return unlessRefused([&] {
         const PictureForm form = requirePictureForm(picturePath);
-        const TimelineDocument loaded = TimelineDocument::load(document);
+        const ProjectDocument loaded = ProjectDocument::load(document);
         const TimelinePicture picture(loaded.timeline(), QFileInfo(document).completeBaseName());
         savePicture(picture, picturePath, form);
         return Success;

@@ -4,7 +4,8 @@
 #include "host/commands/Refusal.h"
 #include "host/media/MediaTable.h"
 #include "host/media/ResourceText.h"
-#include "host/project/DocumentFile.h"
+#include "host/project/ProjectDocument.h"
+#include "host/project/ProjectFacts.h"
 #include "host/timeline/TimelineTable.h"
 
 #include <EditorModel/media/File.h>
@@ -35,6 +36,7 @@ void append(std::string& text, const std::string& part)
     text += (text.empty() ? "" : "\n") + part;
 }
 
+/// Of a plain document.
 std::string textOf(const Document::Graph& graph)
 {
     std::string text;
@@ -56,10 +58,12 @@ std::string textOf(const Document::Graph& graph)
 ExitCode show(const QString& path)
 {
     return unlessRefused([&] {
-        // What the commands write is read from anybody; nothing else needs to be.
-        const std::string text = textOf(loadDocument(path));
+        const ProjectDocument document = ProjectDocument::load(path);
+        const std::string text =
+            document.project() ? projectText(*document.project()) : textOf(document.graph());
         if (text.empty()) {
-            throw Refusal(path, "holds no timeline, no descriptions of media files and no resources");
+            throw Refusal(path,
+                          "holds no project, no timeline, no descriptions of media files and no resources");
         }
         return writeOutput(text) ? Success : Failure;
     });

@@ -7,7 +7,7 @@
 
 namespace Host {
 
-/// Prints the timelines, the media files and the resources of a document as they were when it was saved; the
+/// Prints what is in a project, or the timelines, the media files and the resources of another document, as they were when it was saved; the
 /// files themselves are not looked at.
 ExitCode show(const QString& path);
 

@@ -246,7 +246,7 @@ TEST_P(SavedEnvelopes, AreNoDescriptions)
     const Outcome shown = editormodel({"show", document});
     EXPECT_EQ(shown.exitCode, 1);
     EXPECT_THAT(shown.errors,
-                HasSubstr("holds no timeline, no descriptions of media files and no resources"));
+                HasSubstr("holds no project, no timeline, no descriptions of media files and no resources"));
 }
 
 TEST_P(SavedEnvelopes, AreReadInEveryForm)

@@ -2,7 +2,7 @@
 #include "Command.h"
 #include "tests/host/shared/Samples.h"
 
-#include "host/project/TimelineDocument.h"
+#include "host/project/ProjectDocument.h"
 #include "host/timeline/TimelineOutline.h"
 
 #include <EditorModel/effects/Transition.h>
@@ -17,7 +17,7 @@
 namespace {
 
 using namespace HostTests;
-using Host::TimelineDocument;
+using Host::ProjectDocument;
 using Host::TimelineOutline;
 using testing::AllOf;
 using testing::EndsWith;
@@ -49,25 +49,25 @@ public:
     }
 
     /// The edit must succeed.
-    TimelineDocument edited(const QString& words) const
+    ProjectDocument edited(const QString& words) const
     {
         const Outcome outcome = edit(words);
         EXPECT_EQ(outcome.exitCode, 0) << words.toStdString();
         EXPECT_THAT(outcome.errors, IsEmpty());
         EXPECT_THAT(outcome.output, IsEmpty());
-        return TimelineDocument::load(path());
+        return ProjectDocument::load(path());
     }
 
 private:
     const Folder m_folder;
 };
 
-const Clip* clipAt(const TimelineDocument& document, int number)
+const Clip* clipAt(const ProjectDocument& document, int number)
 {
     return TimelineOutline(document.timeline()).clips().at(static_cast<std::size_t>(number) - 1);
 }
 
-const ClipTiming& timingAt(const TimelineDocument& document, int number)
+const ClipTiming& timingAt(const ProjectDocument& document, int number)
 {
     return document.timeline().clipTiming(clipAt(document, number));
 }
@@ -75,7 +75,7 @@ const ClipTiming& timingAt(const TimelineDocument& document, int number)
 TEST(NewCommand, LaysMediaOneAfterAnother)
 {
     const Project project;
-    const TimelineDocument document = TimelineDocument::load(project.path());
+    const ProjectDocument document = ProjectDocument::load(project.path());
     const Timeline::Object& timeline = document.timeline();
     const TimelineOutline outline(timeline);
     ASSERT_EQ(outline.clips().size(), 6u);
@@ -114,7 +114,7 @@ TEST(NewCommand, TakesCoverArtForNoPicture)
 {
     const Folder folder;
     ASSERT_EQ(editormodel({"new", folder.path("a.xml"), "--media", sample("song.mp3")}).exitCode, 0);
-    const TimelineDocument document = TimelineDocument::load(folder.path("a.xml"));
+    const ProjectDocument document = ProjectDocument::load(folder.path("a.xml"));
     ASSERT_EQ(document.timeline().clips.size(), 1u);
     EXPECT_EQ(clipAt(document, 1)->type, Clip::AudioClip);
     EXPECT_EQ(timingAt(document, 1).track->type, AudioTrack);
@@ -152,10 +152,10 @@ TEST(NewCommand, ReplacesNoFile)
 TEST(EditCommand, AddsFiles)
 {
     const Project project;
-    const TimelineDocument appended = project.edited("add speech.wav");
+    const ProjectDocument appended = project.edited("add speech.wav");
     EXPECT_EQ(timingAt(appended, 7).timestamp, MTime(1500));
     // The clips behind make room, with their sound.
-    const TimelineDocument inserted = project.edited("add film.mp4 2");
+    const ProjectDocument inserted = project.edited("add film.mp4 2");
     EXPECT_EQ(clipAt(inserted, 2)->name, "film.mp4");
     EXPECT_EQ(timingAt(inserted, 2).timestamp, MTime(2000));
     EXPECT_EQ(timingAt(inserted, 3).timestamp, MTime(4000));
@@ -166,10 +166,10 @@ TEST(EditCommand, AddsFiles)
 TEST(EditCommand, MovesClips)
 {
     const Project project;
-    const TimelineDocument moved = project.edited("move long.mkv 7.5");
+    const ProjectDocument moved = project.edited("move long.mkv 7.5");
     EXPECT_EQ(timingAt(moved, 3).timestamp, MTime(7500));
     EXPECT_EQ(timingAt(moved, 5).timestamp, MTime(7500));
-    const TimelineDocument raised = project.edited("move 6 0:03 3 1");
+    const ProjectDocument raised = project.edited("move 6 0:03 3 1");
     EXPECT_EQ(timingAt(raised, 6).timestamp, MTime(3000));
     EXPECT_EQ(timingAt(raised, 6).trackLevel, 1);
 }
@@ -177,15 +177,15 @@ TEST(EditCommand, MovesClips)
 TEST(EditCommand, TrimsClipsToATime)
 {
     const Project project;
-    const TimelineDocument right = project.edited("trim-right film.mp4 1.25");
+    const ProjectDocument right = project.edited("trim-right film.mp4 1.25");
     EXPECT_EQ(timingAt(right, 1).duration, MTime(1250));
     EXPECT_EQ(timingAt(right, 4).duration, MTime(1250));
     EXPECT_EQ(timingAt(right, 2).timestamp, MTime(2000));
-    const TimelineDocument left = project.edited("trim-left 3 0:00:07");
+    const ProjectDocument left = project.edited("trim-left 3 0:00:07");
     EXPECT_EQ(timingAt(left, 3).timestamp, MTime(7000));
     EXPECT_EQ(timingAt(left, 3).sourcePosition, MTime(1000));
     EXPECT_EQ(timingAt(left, 3).duration, MTime(3000));
-    const TimelineDocument rippled = project.edited("trim-right 2 5000ms ripple");
+    const ProjectDocument rippled = project.edited("trim-right 2 5000ms ripple");
     EXPECT_EQ(timingAt(rippled, 2).duration, MTime(3000));
     EXPECT_EQ(timingAt(rippled, 3).timestamp, MTime(6000));
 }
@@ -193,7 +193,7 @@ TEST(EditCommand, TrimsClipsToATime)
 TEST(EditCommand, SplitsClips)
 {
     const Project project;
-    const TimelineDocument document = project.edited("split long.mkv 7.5");
+    const ProjectDocument document = project.edited("split long.mkv 7.5");
     ASSERT_EQ(document.timeline().clips.size(), 8u);
     EXPECT_EQ(timingAt(document, 3).end(), MTime(7500));
     EXPECT_EQ(timingAt(document, 4).timestamp, MTime(7500));
@@ -205,7 +205,7 @@ TEST(EditCommand, SplitsClips)
 TEST(EditCommand, ChangesSpeedAndDirection)
 {
     const Project project;
-    const TimelineDocument document = project.edited("speed 3 2 then reverse 3");
+    const ProjectDocument document = project.edited("speed 3 2 then reverse 3");
     EXPECT_EQ(timingAt(document, 3).duration, MTime(2000));
     EXPECT_TRUE(timingAt(document, 3).reversed);
     EXPECT_DOUBLE_EQ(document.timeline().clipSpeed(clipAt(document, 3)), 2.0);
@@ -214,7 +214,7 @@ TEST(EditCommand, ChangesSpeedAndDirection)
 TEST(EditCommand, SetsFades)
 {
     const Project project;
-    const TimelineDocument document = project.edited("fade-in speech.wav 0.5 , fade-out speech.wav 250ms");
+    const ProjectDocument document = project.edited("fade-in speech.wav 0.5 , fade-out speech.wav 250ms");
     EXPECT_EQ(timingAt(document, 6).fadeInDuration, MTime(500));
     EXPECT_EQ(timingAt(document, 6).fadeOutDuration, MTime(250));
 }
@@ -222,7 +222,7 @@ TEST(EditCommand, SetsFades)
 TEST(EditCommand, AddsAndRemovesTransitions)
 {
     const Project project;
-    const TimelineDocument between = project.edited("transition add 1 2 1 wipe");
+    const ProjectDocument between = project.edited("transition add 1 2 1 wipe");
     const Transition::Object* const wipe =
         between.timeline().transitionOf(clipAt(between, 1), clipAt(between, 2));
     ASSERT_TRUE(wipe);
@@ -230,11 +230,11 @@ TEST(EditCommand, AddsAndRemovesTransitions)
     EXPECT_EQ(timingAt(between, 1).transitionOut, MTime(500));
     EXPECT_EQ(timingAt(between, 2).transitionIn, MTime(500));
     // A transition of one clip takes half of the default of two seconds.
-    const TimelineDocument into = project.edited("transition add - 1 then transition add 3 -");
+    const ProjectDocument into = project.edited("transition add - 1 then transition add 3 -");
     EXPECT_EQ(timingAt(into, 1).transitionIn, MTime(1000));
     EXPECT_EQ(timingAt(into, 3).transitionOut, MTime(1000));
     EXPECT_EQ(into.timeline().transitions.size(), 3u);
-    const TimelineDocument removed = project.edited("transition remove 1 then transition remove 3");
+    const ProjectDocument removed = project.edited("transition remove 1 then transition remove 3");
     ASSERT_EQ(removed.timeline().transitions.size(), 1u);
     EXPECT_EQ(removed.timeline().transitions.begin()->first->tag, "wipe");
 }
@@ -242,14 +242,14 @@ TEST(EditCommand, AddsAndRemovesTransitions)
 TEST(EditCommand, AddsMovesAndRemovesTracks)
 {
     const Project project;
-    const TimelineDocument added = project.edited("track add audio then track add extra-video");
+    const ProjectDocument added = project.edited("track add audio then track add extra-video");
     ASSERT_EQ(added.timeline().tracks.size(), 5u);
     EXPECT_EQ(added.timeline().tracks[3]->type, AudioTrack);
     EXPECT_EQ(added.timeline().tracks[4]->type, ExtraVideoTrack);
-    const TimelineDocument moved = project.edited("track move 4 3");
+    const ProjectDocument moved = project.edited("track move 4 3");
     EXPECT_TRUE(moved.timeline().isTrackEmpty(moved.timeline().tracks[2]));
     EXPECT_FALSE(moved.timeline().isTrackEmpty(moved.timeline().tracks[3]));
-    const TimelineDocument removed = project.edited("track remove 4");
+    const ProjectDocument removed = project.edited("track remove 4");
     EXPECT_EQ(removed.timeline().tracks.size(), 4u);
     EXPECT_EQ(removed.timeline().clips.size(), 5u);
 }
@@ -257,19 +257,19 @@ TEST(EditCommand, AddsMovesAndRemovesTracks)
 TEST(EditCommand, LinksAndUnlinksClips)
 {
     const Project project;
-    const TimelineDocument linked = project.edited("link 3 6");
+    const ProjectDocument linked = project.edited("link 3 6");
     EXPECT_EQ(linked.timeline().masterOf(clipAt(linked, 6)), clipAt(linked, 3));
-    const TimelineDocument unlinked = project.edited("unlink 6");
+    const ProjectDocument unlinked = project.edited("unlink 6");
     EXPECT_FALSE(unlinked.timeline().isSlave(clipAt(unlinked, 6)));
 }
 
 TEST(EditCommand, DeletesClips)
 {
     const Project project;
-    const TimelineDocument lifted = project.edited("delete film.mp4");
+    const ProjectDocument lifted = project.edited("delete film.mp4");
     ASSERT_EQ(lifted.timeline().clips.size(), 4u);
     EXPECT_EQ(timingAt(lifted, 1).timestamp, MTime(2000));
-    const TimelineDocument extracted = project.edited("extract picture.png");
+    const ProjectDocument extracted = project.edited("extract picture.png");
     EXPECT_EQ(clipAt(extracted, 1)->name, "long.mkv");
     EXPECT_EQ(timingAt(extracted, 1).timestamp, MTime(2000));
 }
@@ -278,7 +278,7 @@ TEST(EditCommand, NumbersWhatItMakesBehindWhatTheDocumentHad)
 {
     const Project project;
     // The right part and its sound are 7 and 8; the numbers of the others stay.
-    const TimelineDocument document =
+    const ProjectDocument document =
         project.edited("split 3 8 then delete 1 then delete 7 then fade-in 6 1");
     EXPECT_EQ(document.timeline().clips.size(), 4u);
     EXPECT_EQ(document.timeline().duration(), MTime(8000));
@@ -355,7 +355,7 @@ TEST(EditCommand, KeepsWhatElseTheDocumentHolds)
     const Folder folder;
     Media::File file;
     file.setPath("other.wav");
-    const TimelineDocument document = TimelineDocument::load(project.path());
+    const ProjectDocument document = ProjectDocument::load(project.path());
     Document::saveFile(folder.path("both.bin"), {&file, &document.timeline()}, Document::Binary,
                        Document::Stream);
     ASSERT_EQ(editormodel({"edit", folder.path("both.bin"), "delete", "6"}).exitCode, 0);

@@ -1,0 +1,72 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "host/project/ProjectDocument.h"
+
+#include "host/commands/Refusal.h"
+#include "host/project/DocumentFile.h"
+#include "host/project/ProjectStore.h"
+
+#include <utility>
+
+namespace Host {
+namespace {
+
+Document::Graph plainDocument(const QString& path)
+{
+    try {
+        return loadDocument(path);
+    } catch (const Document::Error& error) {
+        // So much may be wrong with a project that it isn't known for one.
+        throw ProjectStore::withBackup(path, error);
+    }
+}
+
+} // namespace
+
+ProjectDocument ProjectDocument::load(const QString& path)
+{
+    if (ProjectStore::isProject(path)) {
+        OpenedProject opened = ProjectStore::open(path);
+        Project::Content* const content = &opened.content();
+        return ProjectDocument(path, opened.takeGraph(), content);
+    }
+    Document::Graph graph = plainDocument(path);
+    if (graph.rootAs<Project::Content>()) {
+        // Nothing would tell that such a project is damaged.
+        throw Refusal(path, "holds a project without its checksum");
+    }
+    return ProjectDocument(path, std::move(graph), nullptr);
+}
+
+Timeline::Object& ProjectDocument::timeline() const
+{
+    Timeline::Object* const timeline = m_project ? m_project->timeline : timelineOf(m_graph);
+    if (!timeline) {
+        throw Refusal(m_path, "holds no timeline, but " + contentOf(m_graph));
+    }
+    return *timeline;
+}
+
+void ProjectDocument::save(const QString& path) const
+{
+    if (m_project) {
+        ProjectStore::save(*m_project, path);
+    } else {
+        saveDocument({m_graph.roots().begin(), m_graph.roots().end()}, path);
+    }
+}
+
+ProjectDocument::ProjectDocument(QString path, Document::Graph graph, Project::Content* project)
+    : m_path(std::move(path)), m_graph(std::move(graph)), m_project(project)
+{}
+
+Timeline::Object* timelineOf(const Document::Graph& graph)
+{
+    for (Serialize::ISerializable* root : graph.roots()) {
+        if (auto* const timeline = dynamic_cast<Timeline::Object*>(root)) {
+            return timeline;
+        }
+    }
+    return nullptr;
+}
+
+} // namespace Host

@@ -1,0 +1,42 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include <EditorModel/library/Project.h>
+#include <EditorModel/persistence/Document.h>
+#include <EditorModel/timeline/Timeline.h>
+
+#include <QString>
+
+namespace Host {
+
+/// What the commands work on: a project, or a plain document with a timeline in it, and all that it points
+/// at.
+class ProjectDocument
+{
+public:
+    /// The document may be anybody's. Throws Refusal where there is no file, and Document::Error.
+    static ProjectDocument load(const QString& path);
+
+    /// Null for a plain document.
+    Project::Content* project() const { return m_project; }
+    const Document::Graph& graph() const { return m_graph; }
+
+    /// The project's, or the first root that is one. Throws Refusal where there is none.
+    Timeline::Object& timeline() const;
+
+    /// As what it was loaded as, with what else it holds. The file is replaced as a whole or not at all; its
+    /// ending tells the form. Throws Refusal for another ending, and Document::Error.
+    void save(const QString& path) const;
+
+private:
+    ProjectDocument(QString path, Document::Graph graph, Project::Content* project);
+
+    QString m_path;
+    Document::Graph m_graph;
+    Project::Content* m_project;
+};
+
+/// Which of its roots a plain document is about: the first timeline, or null.
+Timeline::Object* timelineOf(const Document::Graph& graph);
+
+} // namespace Host

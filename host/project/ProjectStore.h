@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include <EditorModel/library/Project.h>
+#include <EditorModel/persistence/Document.h>
+
+#include <QString>
+
+#include <utility>
+
+namespace Host {
+
+/// A project that was read, and owner of all that it consists of.
+class OpenedProject
+{
+public:
+    /// The content is one of the graph's roots.
+    OpenedProject(Document::Graph graph, Project::Content* content);
+
+    Project::Content& content() const { return *m_content; }
+    const Document::Graph& graph() const { return m_graph; }
+    /// Hands over what owns the content, which stays where it is.
+    Document::Graph takeGraph() { return std::move(m_graph); }
+
+private:
+    Document::Graph m_graph;
+    Project::Content* m_content;
+};
+
+/// The module that saves whole projects and opens them. After either it publishes ProjectContentSaved or
+/// ProjectContentLoaded with its context; what a subscriber throws passes through, and the project is saved
+/// then. Errors are a Document::Error that names the file and the reason.
+class ProjectStore
+{
+public:
+    /// Replaces the file, and keeps the old one as backup, both whole at every instant; the ending of the
+    /// name tells the form. Where it fails the old file stands as it was.
+    static void save(const Project::Content& content, const QString& path);
+
+    /// The file may be anybody's. Where it cannot be read and its backup can, the error says so.
+    static OpenedProject open(const QString& path);
+    /// The project that was under this name before the last save.
+    static OpenedProject openBackup(const QString& path);
+
+    /// By its marks; false for a file that cannot be read.
+    static bool isProject(const QString& path);
+    /// Where save() keeps the old file.
+    static QString backupOf(const QString& path);
+    /// The error, and in its reason the backup of the file if that can be opened.
+    static Document::Error withBackup(const QString& path, const Document::Error& error);
+};
+
+} // namespace Host
