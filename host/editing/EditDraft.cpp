@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <deque>
+#include <iterator>
 #include <utility>
 
 namespace Host {
@@ -17,13 +18,26 @@ using Timeline::Clip;
 using Timeline::ClipPair;
 using Timeline::ClipTiming;
 
+MTime distance(const Timeline::Object& timeline, const Clip* master, const Clip* slave)
+{
+    return timeline.clipTiming(slave).timestamp - timeline.clipTiming(master).timestamp;
+}
+
+template <class Map, class Predicate>
+void eraseIf(Map& map, const Predicate& isGone)
+{
+    for (auto entry = map.begin(); entry != map.end();) {
+        entry = isGone(*entry) ? map.erase(entry) : std::next(entry);
+    }
+}
+
 } // namespace
 
-EditDraft::EditDraft(const Timeline::Object& before) : m_timeline(before)
+ClipTiming& EditDraft::timing(const Clip* clip)
 {
-    for (const auto& [slave, link] : m_timeline.links) {
-        m_apart[slave] = {link.master, distance(link.master, slave)};
-    }
+    ClipTiming& found = m_timeline.clips.at(clip);
+    m_touched.insert(clip);
+    return found;
 }
 
 // Questions
@@ -70,9 +84,11 @@ EditDraft::Clips EditDraft::withDependants(const Clips& clips, const Clip* fixed
     return all;
 }
 
-MTime EditDraft::distance(const Clip* master, const Clip* slave) const
+MTime EditDraft::formerDistance(const Clip* slave) const
 {
-    return m_timeline.clipTiming(slave).timestamp - m_timeline.clipTiming(master).timestamp;
+    const auto changed = m_formerDistances.find(slave);
+    return changed != m_formerDistances.end() ? changed->second
+                                              : distance(m_before, m_before.masterOf(slave), slave);
 }
 
 // Moving
@@ -85,11 +101,13 @@ void EditDraft::shift(const Clips& clips, MTime delta)
     for (const Clip* const clip : clips) {
         const bool followsMaster =
             m_timeline.isNativeAudio(clip) && clips.count(m_timeline.masterOf(clip)) != 0;
+        ClipTiming& moved = m_timeline.clips.at(clip);
         if (!followsMaster && !m_timeline.canEditTiming(clip)) {
-            throw EditRefused{"The " + clipText(clip) + " at " + timeText(timing(clip).timestamp) +
+            throw EditRefused{"The " + clipText(clip) + " at " + timeText(moved.timestamp) +
                               " would have to move, but its timing can't be edited."};
         }
-        timing(clip).timestamp += delta;
+        moved.timestamp += delta;
+        m_touched.insert(m_touched.end(), clip);
     }
 }
 
@@ -102,50 +120,58 @@ void EditDraft::ripple(const Lane& lane, MTime from, MTime delta, const Clip* fi
 
 void EditDraft::link(const Clip* master, const Clip* slave)
 {
-    const MTime offset = distance(master, slave);
+    const MTime offset = distance(m_timeline, master, slave);
     m_timeline.addLink(master, slave, offset);
-    m_apart[slave] = {master, offset};
+    m_formerDistances[slave] = offset;
 }
 
 void EditDraft::unlink(const Clip* slave)
 {
     m_timeline.removeLink(slave);
-    m_apart.erase(slave);
 }
 
 void EditDraft::relink(const Clip* slave, const Clip* master)
 {
-    const Apart before = m_apart.at(slave);
-    const MTime now = distance(master, slave);
-    m_timeline.addLink(master, slave, m_timeline.links.at(slave).offset + now - before.distance);
-    m_apart[slave] = {master, now};
+    const MTime now = distance(m_timeline, master, slave);
+    m_timeline.addLink(master, slave, m_timeline.links.at(slave).offset + now - formerDistance(slave));
+    m_formerDistances[slave] = now;
 }
 
 // Taking out
 
-void EditDraft::erase(const Clip* clip)
+void EditDraft::erase(const Clips& clips)
 {
-    // Transitions first: taking one out writes to both its clips.
-    if (const Transition::Object* const inbound = m_timeline.inboundTransitionOf(clip)) {
-        m_timeline.removeTransition(inbound);
+    const auto isGone = [&clips](const Clip* clip) { return clips.count(clip) != 0; };
+    std::vector<const Transition::Object*> transitions;
+    for (const auto& [transition, pair] : m_timeline.transitions) {
+        if (isGone(pair.first) || isGone(pair.second)) {
+            transitions.push_back(transition);
+        }
     }
-    if (const Transition::Object* const outbound = m_timeline.outboundTransitionOf(clip)) {
-        m_timeline.removeTransition(outbound);
+    // Before the clips: taking one out writes to both its clips.
+    for (const Transition::Object* const transition : transitions) {
+        m_timeline.removeTransition(transition);
     }
-    for (const Clip* const slave : m_timeline.findSlaves(clip)) {
-        unlink(slave);
+    eraseIf(m_timeline.links,
+            [&](const auto& entry) { return isGone(entry.first) || isGone(entry.second.master); });
+    eraseIf(m_timeline.trackingLinks, [&](const auto& entry) {
+        return isGone(entry.first) || isGone(entry.second.trackedObject.clip);
+    });
+    for (const Clip* const clip : clips) {
+        m_timeline.removeClip(clip);
     }
-    unlink(clip);
-    m_timeline.removeTrackingLink(clip)->clearTrackingLinks(clip)->removeClip(clip);
-    m_retimed.erase(std::remove(m_retimed.begin(), m_retimed.end(), clip), m_retimed.end());
+    m_retimed.erase(std::remove_if(m_retimed.begin(), m_retimed.end(), isGone), m_retimed.end());
 }
 
-void EditDraft::eraseWithNativeAudio(const Clip* clip)
+void EditDraft::eraseWithNativeAudio(const Clips& clips)
 {
-    for (const Clip* const audio : nativeAudioOf(clip)) {
-        erase(audio);
+    Clips all = clips;
+    for (const auto& [slave, link] : m_timeline.links) {
+        if (clips.count(link.master) != 0 && m_timeline.isNativeAudio(slave)) {
+            all.insert(slave);
+        }
     }
-    erase(clip);
+    erase(all);
 }
 
 // Cutting
@@ -180,7 +206,7 @@ const Clip* EditDraft::cutAlone(const Clip* clip, MTime at)
     }
     if (const Clip* const master = m_timeline.masterOf(clip)) {
         m_timeline.addLink(master, right, m_timeline.links.at(clip).offset);
-        m_apart[right] = m_apart.at(clip);
+        m_formerDistances[right] = formerDistance(clip);
         relink(right, master);
     }
     if (const Timeline::TrackingLinkInfo* const followed = m_timeline.getTrackingLink(clip)) {
@@ -262,7 +288,7 @@ void EditDraft::retimeNativeAudio()
             if (followMaster(master, timing(master), audio, timing(audio))) {
                 noteRetimed(audio);
             } else {
-                erase(audio);
+                erase({audio});
             }
         }
     }
@@ -312,7 +338,9 @@ void EditDraft::limitTransition(const Transition::Object* transition)
 void EditDraft::updateOffsets()
 {
     for (auto& [slave, link] : m_timeline.links) {
-        link.offset += distance(link.master, slave) - m_apart.at(slave).distance;
+        if (m_touched.count(slave) != 0 || m_touched.count(link.master) != 0) {
+            link.offset += distance(m_timeline, link.master, slave) - formerDistance(slave);
+        }
     }
 }
 

@@ -37,11 +37,13 @@ class EditDraft
 public:
     using Clips = std::set<const Timeline::Clip*>;
 
-    explicit EditDraft(const Timeline::Object& before);
+    /// The timeline must outlive the draft, and stay as it is.
+    explicit EditDraft(const Timeline::Object& before) : m_before(before), m_timeline(before) {}
 
     Timeline::Object& timeline() { return m_timeline; }
     const Timeline::Object& timeline() const { return m_timeline; }
-    Timeline::ClipTiming& timing(const Timeline::Clip* clip) { return m_timeline.clips.at(clip); }
+    /// For writing.
+    Timeline::ClipTiming& timing(const Timeline::Clip* clip);
     /// Says that the clip has got another length or stretch, so that finish() looks after its ends.
     void noteRetimed(const Timeline::Clip* clip) { m_retimed.push_back(clip); }
 
@@ -59,9 +61,9 @@ public:
     /// The offset is what the two are apart.
     void link(const Timeline::Clip* master, const Timeline::Clip* slave);
     void unlink(const Timeline::Clip* slave);
-    /// Takes the clip out with all that names it.
-    void erase(const Timeline::Clip* clip);
-    void eraseWithNativeAudio(const Timeline::Clip* clip);
+    /// Takes the clips out with all that names them.
+    void erase(const Clips& clips);
+    void eraseWithNativeAudio(const Clips& clips);
     /// Splits the clip, its native audio too, at a time within it. Returns the right part.
     const Timeline::Clip* cut(const Timeline::Clip* clip, MTime at);
     /// These let the end that is cut off go with its transition and its fade.
@@ -76,15 +78,9 @@ public:
     std::vector<std::unique_ptr<Timeline::Clip>> takeMade() { return std::move(m_made); }
 
 private:
-    /// How a link's clips lay when its offset was right.
-    struct Apart
-    {
-        const Timeline::Clip* master;
-        MTime distance;
-    };
-
     const Timeline::Clip* makeCopy(const Timeline::Clip* clip);
-    MTime distance(const Timeline::Clip* master, const Timeline::Clip* slave) const;
+    /// How far the clips of a slave's link lay apart when its offset was right.
+    MTime formerDistance(const Timeline::Clip* slave) const;
     /// Gives the slave another master; the offset changes by as much as the masters lie apart.
     void relink(const Timeline::Clip* slave, const Timeline::Clip* master);
     const Timeline::Clip* cutAlone(const Timeline::Clip* clip, MTime at);
@@ -97,9 +93,13 @@ private:
     void limitTransition(const Transition::Object* transition);
     void updateOffsets();
 
+    const Timeline::Object& m_before;
     Timeline::Object m_timeline;
     std::vector<const Timeline::Clip*> m_retimed;
-    std::map<const Timeline::Clip*, Apart> m_apart;
+    /// Those whose timing may differ from the one before.
+    Clips m_touched;
+    /// The former distances of the links that the draft has made or changed, by their slaves.
+    std::map<const Timeline::Clip*, MTime> m_formerDistances;
     std::vector<std::unique_ptr<Timeline::Clip>> m_made;
 };
 

@@ -61,8 +61,9 @@ void lay(EditDraft& draft, const Placement& what, const ClipTiming& timing)
     }
 }
 
-/// Trims, splits or takes out the clip so that nothing of it lies between the two times.
-void clear(EditDraft& draft, const Clip* clip, MTime from, MTime to)
+/// Trims or splits the clip so that nothing of it lies between the two times. False, with nothing done, where
+/// nothing would be left.
+bool cutOut(EditDraft& draft, const Clip* clip, MTime from, MTime to)
 {
     const ClipTiming& timing = draft.timing(clip);
     const bool keepsLeft = from - timing.timestamp >= Clip::MIN_DURATION;
@@ -74,9 +75,8 @@ void clear(EditDraft& draft, const Clip* clip, MTime from, MTime to)
         draft.cutTail(clip, from);
     } else if (keepsRight) {
         draft.cutHead(clip, to);
-    } else {
-        draft.eraseWithNativeAudio(clip);
     }
+    return keepsLeft || keepsRight;
 }
 
 void clearLane(EditDraft& draft, const ClipTiming& room)
@@ -88,16 +88,13 @@ void clearLane(EditDraft& draft, const ClipTiming& room)
             under.push_back(clip);
         }
     }
+    EditDraft::Clips covered;
     for (const Clip* const clip : under) {
-        clear(draft, clip, room.timestamp, room.end());
+        if (!cutOut(draft, clip, room.timestamp, room.end())) {
+            covered.insert(clip);
+        }
     }
-}
-
-void eraseAll(EditDraft& draft, const EditDraft::Clips& clips)
-{
-    for (const Clip* const clip : clips) {
-        draft.erase(clip);
-    }
+    draft.eraseWithNativeAudio(covered);
 }
 
 /// Native audio that has a master is not removed without it.
@@ -213,7 +210,7 @@ EditResult EditSession::lift(const Clip* clip)
 {
     return edit(clip, [&](EditDraft& draft) {
         checkRemovable(draft.timeline(), clip);
-        eraseAll(draft, draft.withDependants({clip}));
+        draft.erase(draft.withDependants({clip}));
     });
 }
 
@@ -222,7 +219,7 @@ EditResult EditSession::extract(const Clip* clip)
     return edit(clip, [&](EditDraft& draft) {
         checkRemovable(draft.timeline(), clip);
         const ClipTiming timing = draft.timing(clip);
-        eraseAll(draft, draft.withDependants({clip}));
+        draft.erase(draft.withDependants({clip}));
         draft.ripple(laneOf(timing), timing.end(), -timing.duration);
     });
 }

@@ -144,9 +144,7 @@ EditResult EditSession::removeTrack(const Track* track)
 {
     return edit(nullptr, [&](EditDraft& draft) {
         checkListed(draft.timeline(), track);
-        for (const Clip* const clip : draft.withDependants(draft.timeline().clipsAt(track))) {
-            draft.erase(clip);
-        }
+        draft.erase(draft.withDependants(draft.timeline().clipsAt(track)));
         draft.timeline().removeTrack(track);
     });
 }

@@ -176,7 +176,10 @@ private:
         }
         std::set<const Clip*> done;
         for (const auto& [slave, link] : m_timeline.links) {
-            findCycle(slave, done);
+            // Few masters have a master themselves.
+            if (m_timeline.isSlave(link.master)) {
+                findCycle(slave, done);
+            }
         }
     }
 
