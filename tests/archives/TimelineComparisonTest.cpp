@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The comparison of timelines would be worth nothing if there were a difference that it did not see.
 #include "tests/shared/TimelineComparison.h"
+#include "tests/shared/FullProject.h"
 #include "tests/shared/FullTimeline.h"
 
 #include <EditorModel/persistence/Fields.h>
@@ -19,8 +20,10 @@ namespace {
 
 using ::testing::Contains;
 using ::testing::EndsWith;
+using Testing::FullProject;
 using Testing::FullTimeline;
 using ::testing::IsEmpty;
+using Testing::projectDifferences;
 using Testing::timelineDifferences;
 
 TEST(TimelineComparison, TwoOfOneMakeAreEqual)
@@ -183,9 +186,10 @@ struct Site
 class Sites final : public Serialize::Fields
 {
 public:
-    explicit Sites(const Timeline::Object& root) : Fields(false)
+    template <class T>
+    explicit Sites(const T& root) : Fields(false)
     {
-        const Timeline::Object* pointer = &root;
+        const T* pointer = &root;
         (*this)("root", pointer);
         // The pointer to the root is not in the graph.
         m_sites.erase(m_sites.begin());
@@ -285,6 +289,9 @@ private:
 
     void onContainer(const Serialize::Key&, const Serialize::Type& type, void* container) override
     {
+        // The key of an entry.
+        if (std::exchange(m_isKey, false))
+            return;
         const bool isSet = std::string(type.info.name()).rfind("St3set", 0) == 0;
         const bool outer = std::exchange(m_isInSet, isSet);
         type.visit(*this, container);
@@ -325,6 +332,67 @@ TEST(TimelineComparison, EveryFieldThatIsStoredIsCompared)
         site.undo();
     }
     EXPECT_THAT(timelineDifferences(stored.timeline, loaded.timeline), IsEmpty());
+}
+
+TEST(ProjectComparison, TwoOfOneMakeAreEqual)
+{
+    const FullProject first;
+    const FullProject second;
+    EXPECT_THAT(projectDifferences(first.content, second.content), IsEmpty());
+}
+
+TEST(ProjectComparison, EveryFieldThatIsStoredIsCompared)
+{
+    const FullProject stored;
+    FullProject loaded;
+    const std::size_t inTimeline = Sites(loaded.full.timeline).sites().size();
+    const Sites found(loaded.content);
+    // Three pointers and a flag, 5 items, 8 values in each of 4 imports, 7 in each of 6 resources.
+    EXPECT_EQ(found.sites().size() - inTimeline, 4u + 5u + 32u + 42u);
+    for (const Site& site : found.sites()) {
+        site.change();
+        EXPECT_FALSE(projectDifferences(stored.content, loaded.content).empty()) << site.place;
+        site.undo();
+    }
+    EXPECT_THAT(projectDifferences(stored.content, loaded.content), IsEmpty());
+}
+
+TEST(ProjectComparison, WhatIsSharedAndWhatIsOnlyEqualIsToldApart)
+{
+    const FullProject stored;
+    FullProject loaded;
+    loaded.imports.push_back(loaded.imports[0]);
+    loaded.collection.items[3] = &loaded.imports.back();
+    EXPECT_THAT(projectDifferences(stored.content, loaded.content),
+                Contains(EndsWith("userCollection/items[3]")));
+    loaded.collection.items[3] = loaded.collection.items[1];
+    loaded.collection.items[2] = loaded.collection.items[0];
+    EXPECT_THAT(projectDifferences(stored.content, loaded.content),
+                Contains(EndsWith("userCollection/items[2]")));
+}
+
+TEST(ProjectComparison, AnotherSetOfResourcesIsNoticed)
+{
+    const FullProject stored;
+    FullProject loaded;
+    auto node = loaded.table.resource2fileInfo.extract(ResourceRef("clip", Resource::AudioType));
+    EXPECT_THAT(projectDifferences(stored.content, loaded.content),
+                Contains(EndsWith("resource2fileInfo[clip 2]")));
+    std::get<1>(node.key()) = Resource::ImageType;
+    loaded.table.resource2fileInfo.insert(std::move(node));
+    EXPECT_THAT(projectDifferences(stored.content, loaded.content),
+                Contains(EndsWith("resource2fileInfo[clip 2]")));
+}
+
+TEST(ProjectComparison, APackIsNotExpectedBack)
+{
+    FullProject stored;
+    FullProject loaded;
+    stored.setFieldsThatAreNotStored();
+    EXPECT_THAT(projectDifferences(stored.content, loaded.content), IsEmpty());
+    loaded.setFieldsThatAreNotStored();
+    EXPECT_THAT(projectDifferences(stored.content, loaded.content),
+                Contains(EndsWith("userCollection/items[0]/pack")));
 }
 
 } // namespace

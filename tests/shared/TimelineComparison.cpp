@@ -8,7 +8,11 @@
 #include <EditorModel/effects/Overlay.h>
 #include <EditorModel/effects/Quiz.h>
 #include <EditorModel/effects/Transition.h>
+#include <EditorModel/library/EditorCollection.h>
+#include <EditorModel/library/ImportObject.h>
+#include <EditorModel/library/Project.h>
 #include <EditorModel/media/File.h>
+#include <EditorModel/media/ResourceTable.h>
 
 #include <algorithm>
 #include <map>
@@ -40,7 +44,11 @@ public:
 
     const std::vector<std::string>& differences() const { return m_differences; }
 
-    void partners(const Timeline::Object& a, const Timeline::Object& b) { same(&a, &b); }
+    template <class T>
+    void partners(const T& a, const T& b)
+    {
+        same(&a, &b);
+    }
 
 private:
     // The fields of the classes, in the order of their declarations.
@@ -262,6 +270,56 @@ private:
                &T::sourceDurationOriginal);
     }
 
+    void same(const Project::Content& a, const Project::Content& b)
+    {
+        using T = Project::Content;
+        fields(a, b, "timeline", &T::timeline, "userCollection", &T::userCollection, "resourceTable",
+               &T::resourceTable, "portable", &T::portable);
+    }
+
+    void same(const EditorCollection::UserObject& a, const EditorCollection::UserObject& b)
+    {
+        fields(a, b, "items", &EditorCollection::UserObject::items);
+    }
+
+    void same(const Import::Object& a, const Import::Object& b)
+    {
+        using T = Import::Object;
+        defaults(b, "pack", &T::pack);
+        fields(a, b, "tag", &T::tag, "description", &T::description, "descriptionUrl", &T::descriptionUrl,
+               "kind", &T::kind, "category", &T::category);
+        // Without a pack these tell the object's own fields.
+        T own(a);
+        own.pack = nullptr;
+        at("/location", own.location(), b.location());
+        at("/remoteUrl", own.remoteUrl(), b.remoteUrl());
+        at("/remoteSize", own.remoteSize(), b.remoteSize());
+    }
+
+    void same(const ResourceTable::Object& a, const ResourceTable::Object& b)
+    {
+        fields(a, b, "resource2fileInfo", &ResourceTable::Object::resource2fileInfo);
+    }
+
+    void same(const ResourceTable::FileResourceInfo& a, const ResourceTable::FileResourceInfo& b)
+    {
+        using T = ResourceTable::FileResourceInfo;
+        fields(a, b, "info", &T::info, "timing", &T::timing);
+    }
+
+    void same(const Resource::FileInfo& a, const Resource::FileInfo& b)
+    {
+        using T = Resource::FileInfo;
+        fields(a, b, "path", &T::path, "track", &T::track, "duration", &T::duration);
+    }
+
+    void same(const Resource::Timing& a, const Resource::Timing& b)
+    {
+        using T = Resource::Timing;
+        fields(a, b, "mode", &T::mode, "intro", &T::intro, "outro", &T::outro, "loopMinCount",
+               &T::loopMinCount);
+    }
+
     // Values
 
     template <class V>
@@ -288,7 +346,7 @@ private:
     // Pointers
 
     template <class T>
-    void same(const T* a, const T* b)
+    void same(T* a, T* b)
     {
         if (!a && !b)
             return;
@@ -339,6 +397,24 @@ private:
             at("/key", one->first, other->first);
             at("/value", one->second, other->second);
         });
+    }
+
+    void same(const std::map<ResourceRef, ResourceTable::FileResourceInfo>& a,
+              const std::map<ResourceRef, ResourceTable::FileResourceInfo>& b)
+    {
+        const auto keyText = [](const ResourceRef& key) {
+            return "[" + std::get<0>(key).toStdString() + " " + std::to_string(std::get<1>(key)) + "]";
+        };
+        for (const auto& entry : a) {
+            const Place place(*this, keyText(entry.first));
+            const auto other = b.find(entry.first);
+            if (other == b.end())
+                differ();
+            else
+                same(entry.second, other->second);
+        }
+        if (a.size() != b.size())
+            differ();
     }
 
     template <class K>
@@ -426,6 +502,14 @@ private:
 
 std::vector<std::string> timelineDifferences(const Timeline::Object& stored, const Timeline::Object& loaded,
                                              bool wrapsTimes)
+{
+    Comparison comparison(wrapsTimes);
+    comparison.partners(stored, loaded);
+    return comparison.differences();
+}
+
+std::vector<std::string> projectDifferences(const Project::Content& stored, const Project::Content& loaded,
+                                            bool wrapsTimes)
 {
     Comparison comparison(wrapsTimes);
     comparison.partners(stored, loaded);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include <EditorModel/library/Project.h>
 #include <EditorModel/timeline/Timeline.h>
 
 #include <string>
@@ -16,5 +17,10 @@ namespace Testing {
 /// not keep has its defaults in `loaded`. `wrapsTimes` takes times as they are after a store of 32 bits.
 std::vector<std::string> timelineDifferences(const Timeline::Object& stored, const Timeline::Object& loaded,
                                              bool wrapsTimes = false);
+
+/// The same for whole projects: "userCollection/items[0]/tag". Entries of the table of resources go by their
+/// keys.
+std::vector<std::string> projectDifferences(const Project::Content& stored, const Project::Content& loaded,
+                                            bool wrapsTimes = false);
 
 } // namespace Testing
