@@ -29,7 +29,8 @@ class EDITORMODEL_EXPORT StateView : public Details::StateViewBase
 {
 protected:
     /// The state of the item, which the view observes from then on. Whoever owns the states is asked for one
-    /// that is not known here; null if nobody answers.
+    /// that is not known here; null if nobody answers. An owner that asks itself for a state which it makes
+    /// only then ends up observing it.
     const State* importStateOf(const Import::Object* object);
 
     /// Asks the owner of the state to fetch the item. Nothing happens in a stage other than Initial and
