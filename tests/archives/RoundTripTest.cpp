@@ -49,7 +49,8 @@ TEST_P(EveryClass, ComesBackWithDefaults)
 
 TEST_P(EveryClass, ComesBackWithTimesThatNeedMoreThan32Bits)
 {
-    Filler filler(MTime((qint64(1) << 31) - 1));
+    // From the first that wraps on, so that times that are keys of a map keep their order.
+    Filler filler(MTime(qint64(1) << 31));
     expectRoundTrip(*filler.make(type()));
 }
 
