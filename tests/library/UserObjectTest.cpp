@@ -22,9 +22,9 @@ static_assert(std::is_same_v<decltype(std::declval<UserObject>().addItem(nullptr
 class UserCollection : public ::testing::Test
 {
 protected:
-    const Import::Object a;
-    const Import::Object b;
-    const Import::Object c;
+    Import::Object a;
+    Import::Object b;
+    Import::Object c;
     UserObject collection;
 };
 
