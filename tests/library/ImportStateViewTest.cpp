@@ -298,6 +298,8 @@ TEST_F(ImportStateView, OfTwoStatesOfOneItemKnowsTheLaterOne)
     another.setImport(&rain);
     view.importStateObserve(&another);
     EXPECT_EQ(view.importStateOf(&rain), &another);
+    owner.importStateChange(&state)->setStage(State::Requested);
+    EXPECT_EQ(view.importStateOf(&rain), &another) << "a change of stage leaves what is known";
     // The end of either makes the view ask again, though it observes the other.
     owner.importStateRemove(&state);
     take();
