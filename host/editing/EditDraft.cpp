@@ -66,6 +66,12 @@ EditDraft::Clips EditDraft::laterClips(const Lane& lane, MTime from) const
 
 EditDraft::Clips EditDraft::withDependants(const Clips& clips, const Clip* fixed) const
 {
+    return withSlaves(clips, [fixed](const Clip* clip) { return clip != fixed; });
+}
+
+EditDraft::Clips EditDraft::withSlaves(const Clips& clips,
+                                       const std::function<bool(const Clip*)>& isAccepted) const
+{
     // One walk over the links, not one for each clip: a ripple takes most of a timeline along.
     const auto slavesOf = m_timeline.master2slaves();
     Clips all;
@@ -73,7 +79,7 @@ EditDraft::Clips EditDraft::withDependants(const Clips& clips, const Clip* fixed
     while (!queue.empty()) {
         const Clip* const clip = queue.front();
         queue.pop_front();
-        if (clip == fixed || !all.insert(clip).second) {
+        if (!isAccepted(clip) || !all.insert(clip).second) {
             continue;
         }
         const auto slaves = slavesOf.find(clip);
@@ -165,13 +171,11 @@ void EditDraft::erase(const Clips& clips)
 
 void EditDraft::eraseWithNativeAudio(const Clips& clips)
 {
-    Clips all = clips;
-    for (const auto& [slave, link] : m_timeline.links) {
-        if (clips.count(link.master) != 0 && m_timeline.isNativeAudio(slave)) {
-            all.insert(slave);
-        }
+    if (!clips.empty()) {
+        erase(withSlaves(clips, [&](const Clip* clip) {
+            return clips.count(clip) != 0 || m_timeline.isNativeAudio(clip);
+        }));
     }
-    erase(all);
 }
 
 // Cutting
@@ -185,10 +189,16 @@ const Clip* EditDraft::makeCopy(const Clip* clip)
 const Clip* EditDraft::cut(const Clip* clip, MTime at)
 {
     const Clip* const right = cutAlone(clip, at);
-    handOverSlaves(clip, right);
-    handOverFollowers(clip, right);
     noteRetimed(clip);
     noteRetimed(right);
+    std::deque<Parts> queue{{clip, right}};
+    while (!queue.empty()) {
+        const Parts parts = queue.front();
+        queue.pop_front();
+        const std::vector<Parts> audio = handOverSlaves(parts);
+        queue.insert(queue.end(), audio.begin(), audio.end());
+        handOverFollowers(parts);
+    }
     return right;
 }
 
@@ -215,24 +225,27 @@ const Clip* EditDraft::cutAlone(const Clip* clip, MTime at)
     return right;
 }
 
-void EditDraft::handOverSlaves(const Clip* left, const Clip* right)
+std::vector<EditDraft::Parts> EditDraft::handOverSlaves(const Parts& parts)
 {
-    const MTime at = timing(right).timestamp;
-    for (const Clip* const slave : m_timeline.findSlaves(left)) {
+    const MTime at = timing(parts.right).timestamp;
+    std::vector<Parts> audio;
+    for (const Clip* const slave : m_timeline.findSlaves(parts.left)) {
         if (timing(slave).timestamp >= at) {
-            relink(slave, right);
+            relink(slave, parts.right);
         } else if (m_timeline.isNativeAudio(slave) && timing(slave).end() > at) {
-            relink(cutAlone(slave, at), right);
+            audio.push_back({slave, cutAlone(slave, at)});
+            relink(audio.back().right, parts.right);
         }
     }
+    return audio;
 }
 
-void EditDraft::handOverFollowers(const Clip* left, const Clip* right)
+void EditDraft::handOverFollowers(const Parts& parts)
 {
-    const MTime at = timing(right).timestamp;
+    const MTime at = timing(parts.right).timestamp;
     for (auto& [follower, info] : m_timeline.trackingLinks) {
-        if (info.trackedObject.clip == left && timing(follower).timestamp >= at) {
-            info.trackedObject.clip = right;
+        if (info.trackedObject.clip == parts.left && timing(follower).timestamp >= at) {
+            info.trackedObject.clip = parts.right;
         }
     }
 }
@@ -282,16 +295,19 @@ void EditDraft::finish()
 
 void EditDraft::retimeNativeAudio()
 {
-    const std::vector<const Clip*> masters = m_retimed;
-    for (const Clip* const master : masters) {
+    Clips mute;
+    // The list grows: native audio may be the master of native audio.
+    for (std::size_t i = 0; i != m_retimed.size(); ++i) {
+        const Clip* const master = m_retimed[i];
         for (const Clip* const audio : nativeAudioOf(master)) {
             if (followMaster(master, timing(master), audio, timing(audio))) {
                 noteRetimed(audio);
             } else {
-                erase({audio});
+                mute.insert(audio);
             }
         }
     }
+    eraseWithNativeAudio(mute);
 }
 
 void EditDraft::limitFades()

@@ -5,6 +5,7 @@
 
 #include <QString>
 
+#include <functional>
 #include <map>
 #include <memory>
 #include <set>
@@ -64,7 +65,8 @@ public:
     /// Takes the clips out with all that names them.
     void erase(const Clips& clips);
     void eraseWithNativeAudio(const Clips& clips);
-    /// Splits the clip, its native audio too, at a time within it. Returns the right part.
+    /// Splits the clip, its native audio too, at a time within it. Slaves and followers that start at the cut
+    /// or behind go over to the right part. Returns that.
     const Timeline::Clip* cut(const Timeline::Clip* clip, MTime at);
     /// These let the end that is cut off go with its transition and its fade.
     void cutHead(const Timeline::Clip* clip, MTime newStart);
@@ -78,14 +80,24 @@ public:
     std::vector<std::unique_ptr<Timeline::Clip>> takeMade() { return std::move(m_made); }
 
 private:
+    /// What a cut has left of a clip.
+    struct Parts
+    {
+        const Timeline::Clip* left;
+        const Timeline::Clip* right;
+    };
+
     const Timeline::Clip* makeCopy(const Timeline::Clip* clip);
     /// How far the clips of a slave's link lay apart when its offset was right.
     MTime formerDistance(const Timeline::Clip* slave) const;
     /// Gives the slave another master; the offset changes by as much as the masters lie apart.
     void relink(const Timeline::Clip* slave, const Timeline::Clip* master);
     const Timeline::Clip* cutAlone(const Timeline::Clip* clip, MTime at);
-    void handOverSlaves(const Timeline::Clip* left, const Timeline::Clip* right);
-    void handOverFollowers(const Timeline::Clip* left, const Timeline::Clip* right);
+    /// Gives the right part what lies with it, and cuts native audio. Returns the parts of that.
+    std::vector<Parts> handOverSlaves(const Parts& parts);
+    void handOverFollowers(const Parts& parts);
+    /// With their slaves and the slaves of those, all that are accepted.
+    Clips withSlaves(const Clips& clips, const std::function<bool(const Timeline::Clip*)>& isAccepted) const;
 
     void retimeNativeAudio();
     void limitFades();

@@ -176,6 +176,69 @@ TEST_F(EditSessionStructure, TheOffsetOfAForeignLinkChangesByWhatTheClipsMove)
     EXPECT_THAT(links(), ElementsAre("s(4300)>c(4000)+105"));
 }
 
+// Native audio
+
+class NativeAudioWithSlaves : public EditSessionStructure
+{
+protected:
+    NativeAudioWithSlaves()
+    {
+        done(session.append({x, primary, 0, 0, 1000, xn}));
+        done(session.addTrack(second));
+    }
+
+    /// Another module makes it native audio of the native audio.
+    void layBelow(MTime duration)
+    {
+        watcher.change(session.timeline())
+            ->addClip(yn, ClipTiming(second, 0, 4000, duration, 0, 10000))
+            ->addLink(xn, yn, 0);
+    }
+
+    Clip* xn = sound("xn", 600);
+    Clip* yn = sound("yn");
+    Track* second = session.makeTrack(NativeAudioTrack);
+};
+
+TEST_F(NativeAudioWithSlaves, DealsThemOutWhereItIsCutWithItsMaster)
+{
+    Clip* const s = overlay("s");
+    Clip* const t = overlay("t");
+    lay(s, title, 4100, 100);
+    lay(t, title, 4400, 100);
+    done(session.link(xn, s));
+    done(session.link(xn, t));
+    track(s, xn);
+    track(t, xn);
+    done(session.split(x, 4300));
+    EXPECT_THAT(links(), ElementsAre("s(4100)>xn(4000)+100", "t(4400)>xn(4300)+100", "xn(4000)>x(4000)+0",
+                                     "xn(4300)>x(4300)+0"));
+    EXPECT_EQ(now().getTrackingLink(s)->trackedObject.clip, xn);
+    EXPECT_EQ(now().getTrackingLink(t)->trackedObject.clip, now().masterOf(t));
+}
+
+TEST_F(NativeAudioWithSlaves, TakesNativeAudioOfItsOwnAlong)
+{
+    layBelow(600);
+    EXPECT_TRUE(session.trimRight(x, 500));
+    EXPECT_EQ(row(native), "xn 4000-4500 @0");
+    EXPECT_EQ(row(second), "yn 4000-4500 @0");
+    EXPECT_TRUE(session.split(x, 4300));
+    EXPECT_EQ(row(second), "yn 4000-4300 @0, yn 4300-4500 @300");
+    EXPECT_THAT(links(), ElementsAre("xn(4000)>x(4000)+0", "xn(4300)>x(4300)+0", "yn(4000)>xn(4000)+0",
+                                     "yn(4300)>xn(4300)+0"));
+}
+
+TEST_F(NativeAudioWithSlaves, GoesWithNativeAudioOfItsOwn)
+{
+    layBelow(600);
+    // 9 of 600 ms would be left.
+    EXPECT_TRUE(session.trimLeft(x, 591));
+    EXPECT_EQ(row(native), "");
+    EXPECT_EQ(row(second), "");
+    EXPECT_THAT(links(), IsEmpty());
+}
+
 // Sharing
 
 TEST_F(EditSessionStructure, RequestsOfOthersAreGrantedWhereTheyLeaveNoFault)
