@@ -91,6 +91,13 @@ TEST_F(UserCollection, AnItemThatCameTwiceGoesOnce)
     EXPECT_THAT(collection.items, ElementsAre(&b));
 }
 
+TEST_F(UserCollection, AnItemThatIsNotListedTakesNoOtherWithIt)
+{
+    collection.items = {&a, &b};
+    collection.removeItem(&c);
+    EXPECT_THAT(collection.items, ElementsAre(&a, &b));
+}
+
 TEST_F(UserCollection, ClearingLeavesNoItem)
 {
     collection.items = {&a, &a, &b};

@@ -20,8 +20,8 @@ PubSub::Object* UserObject::addItem(const Import::Object* item)
 PubSub::Object* UserObject::removeItem(const Import::Object* item)
 {
     const auto place = std::find(items.begin(), items.end(), item);
-    Q_ASSERT(place != items.end());
-    items.erase(place);
+    if (place != items.end())
+        items.erase(place);
     return this;
 }
 

@@ -30,7 +30,7 @@ public:
 
     /// Appends, also what is listed already.
     PubSub::Object* addItem(const Import::Object* item);
-    /// Takes out the first occurrence. The item must be listed.
+    /// Takes out the first occurrence. What isn't listed is an error of the caller, and changes nothing.
     PubSub::Object* removeItem(const Import::Object* item);
     PubSub::Object* clear();
     PubSub::Object* setItems(std::deque<const Import::Object*> newItems);
