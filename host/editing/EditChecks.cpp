@@ -2,6 +2,7 @@
 #include "host/editing/EditChecks.h"
 
 #include "host/editing/EditText.h"
+#include "host/editing/NestedTimelines.h"
 #include "host/editing/TimelineInvariants.h"
 
 namespace Host {
@@ -35,8 +36,25 @@ QString at(MTime time)
     return " at " + timeText(time);
 }
 
-void checkNew(const Timeline::Object& timeline, const Clip* clip)
+/// Whoever places it would wait for its end in vain.
+void checkNesting(const EditDraft& draft, const Clip* clip)
 {
+    if (!clip->nestedTimeline) {
+        return;
+    }
+    std::vector<const Clip*> nesting = nestingClips(draft.timeline());
+    nesting.push_back(clip);
+    if (!endlessClips(draft.edited(), nesting).empty()) {
+        throw EditRefused{
+            "The " + clipText(clip) +
+            " can't be placed: the timeline that it shows would show itself, directly or by way "
+            "of others."};
+    }
+}
+
+void checkNew(const EditDraft& draft, const Clip* clip)
+{
+    const Timeline::Object& timeline = draft.timeline();
     if (!clip) {
         throw EditRefused{"There is no clip to place."};
     }
@@ -44,11 +62,17 @@ void checkNew(const Timeline::Object& timeline, const Clip* clip)
         throw EditRefused{"The " + clipText(clip) + " is on the timeline already" +
                           at(timeline.clipTiming(clip).timestamp) + "."};
     }
+    if (clip->timeline && clip->timeline != &draft.edited()) {
+        throw EditRefused{"The " + clipText(clip) + " belongs to another timeline."};
+    }
+    checkTime(clip->sourceDuration);
+    checkNesting(draft, clip);
 }
 
-void checkNativeAudio(const Timeline::Object& timeline, const Placement& what)
+void checkNativeAudio(const EditDraft& draft, const Placement& what)
 {
-    checkNew(timeline, what.nativeAudio);
+    const Timeline::Object& timeline = draft.timeline();
+    checkNew(draft, what.nativeAudio);
     if (what.nativeAudio == what.clip) {
         throw EditRefused{"The " + clipText(what.clip) + " can't be its own native audio."};
     }
@@ -141,17 +165,17 @@ void checkLane(const Timeline::Object& timeline, const Clip* clip, const Lane& l
     }
 }
 
-ClipTiming checkedTiming(const Timeline::Object& timeline, const Placement& what, MTime time)
+ClipTiming checkedTiming(const EditDraft& draft, const Placement& what, MTime time)
 {
-    checkNew(timeline, what.clip);
-    checkLane(timeline, what.clip, {what.track, what.level}, time);
+    checkNew(draft, what.clip);
+    checkLane(draft.timeline(), what.clip, {what.track, what.level}, time);
     if (what.nativeAudio) {
-        checkNativeAudio(timeline, what);
+        checkNativeAudio(draft, what);
     }
-    const MTime source = what.clip->sourceDuration;
-    for (const MTime checked : {time, what.sourcePosition, what.duration, source}) {
+    for (const MTime checked : {time, what.sourcePosition, what.duration}) {
         checkTime(checked);
     }
+    const MTime source = what.clip->sourceDuration;
     const MTime duration = what.duration == MTime(-1) ? source - what.sourcePosition : what.duration;
     checkLength(what.clip, time, duration);
     const ClipTiming timing(what.track, what.level, time, duration, what.sourcePosition, source);

@@ -26,6 +26,6 @@ void checkListed(const Timeline::Object& timeline, const Timeline::Track* track)
 void checkLane(const Timeline::Object& timeline, const Timeline::Clip* clip, const Lane& lane, MTime at);
 
 /// Checks all that doesn't depend on what lies there, and gives the timing with which the clip is laid.
-Timeline::ClipTiming checkedTiming(const Timeline::Object& timeline, const Placement& what, MTime at);
+Timeline::ClipTiming checkedTiming(const EditDraft& draft, const Placement& what, MTime at);
 
 } // namespace Host

@@ -104,15 +104,22 @@ void EditDraft::shift(const Clips& clips, MTime delta)
     if (delta == MTime()) {
         return;
     }
+    std::vector<const Clip*> immovable;
     for (const Clip* const clip : clips) {
         const bool followsMaster =
             m_timeline.isNativeAudio(clip) && clips.count(m_timeline.masterOf(clip)) != 0;
-        ClipTiming& moved = m_timeline.clips.at(clip);
         if (!followsMaster && !m_timeline.canEditTiming(clip)) {
-            throw EditRefused{"The " + clipText(clip) + " at " + timeText(moved.timestamp) +
-                              " would have to move, but its timing can't be edited."};
+            immovable.push_back(clip);
         }
-        moved.timestamp += delta;
+    }
+    if (!immovable.empty()) {
+        const Clip* const first =
+            *std::min_element(immovable.begin(), immovable.end(), ClipOrder(&m_timeline));
+        throw EditRefused{"The " + clipText(first) + " at " + timeText(timing(first).timestamp) +
+                          " would have to move, but its timing can't be edited."};
+    }
+    for (const Clip* const clip : clips) {
+        m_timeline.clips.at(clip).timestamp += delta;
         m_touched.insert(m_touched.end(), clip);
     }
 }

@@ -41,6 +41,8 @@ public:
     /// The timeline must outlive the draft, and stay as it is.
     explicit EditDraft(const Timeline::Object& before) : m_before(before), m_timeline(before) {}
 
+    /// The one that is edited, whose address clips and tracks may name.
+    const Timeline::Object& edited() const { return m_before; }
     Timeline::Object& timeline() { return m_timeline; }
     const Timeline::Object& timeline() const { return m_timeline; }
     /// For writing.

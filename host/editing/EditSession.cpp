@@ -20,10 +20,10 @@ using Timeline::ClipPair;
 using Timeline::ClipTiming;
 using Timeline::Track;
 
-QString faultOf(const Timeline::Object& timeline)
+/// Empty where there is none.
+QString firstFault(const QString& opening, const std::vector<TimelineFault>& faults)
 {
-    const std::vector<TimelineFault> faults = timelineFaults(timeline);
-    return faults.empty() ? QString() : faults.front().text;
+    return faults.empty() ? QString() : opening + faults.front().text;
 }
 
 Lane laneOf(const ClipTiming& timing)
@@ -84,12 +84,13 @@ void clearLane(EditDraft& draft, const ClipTiming& room)
     std::vector<const Clip*> under;
     for (const auto& [clip, timing] : draft.timeline().clips) {
         if (laneOf(room).holds(timing) && timing.overlapsWith(room)) {
-            checkEditable(draft.timeline(), clip);
             under.push_back(clip);
         }
     }
+    std::sort(under.begin(), under.end(), ClipOrder(&draft.timeline()));
     EditDraft::Clips covered;
     for (const Clip* const clip : under) {
+        checkEditable(draft.timeline(), clip);
         if (!cutOut(draft, clip, room.timestamp, room.end())) {
             covered.insert(clip);
         }
@@ -141,8 +142,13 @@ EditSession::EditSession() : m_own(std::make_unique<Timeline::Object>()), m_time
     own(m_timeline);
 }
 
-EditSession::EditSession(Timeline::Object* timeline) : m_timeline(timeline), m_fault(faultOf(*timeline))
+EditSession::EditSession(Timeline::Object* timeline) : m_timeline(timeline)
 {
+    if (enumerateAll().count(timeline) != 0) {
+        m_refusal = "The timeline is edited by somebody else.";
+        return;
+    }
+    m_refusal = firstFault("The timeline has a fault: ", timelineFaults(*timeline));
     own(m_timeline);
 }
 
@@ -177,14 +183,14 @@ EditResult EditSession::append(const Placement& what)
 {
     return edit(what.clip, [&](EditDraft& draft) {
         const MTime at = endOf(draft.timeline(), {what.track, what.level});
-        lay(draft, what, checkedTiming(draft.timeline(), what, at));
+        lay(draft, what, checkedTiming(draft, what, at));
     });
 }
 
 EditResult EditSession::insert(const Placement& what, MTime at)
 {
     return edit(what.clip, [&](EditDraft& draft) {
-        const ClipTiming timing = checkedTiming(draft.timeline(), what, at);
+        const ClipTiming timing = checkedTiming(draft, what, at);
         const Clip* const across = clipAcross(draft.timeline(), laneOf(timing), at);
         if (across) {
             checkCanSplit(draft.timeline(), across, at);
@@ -198,7 +204,7 @@ EditResult EditSession::insert(const Placement& what, MTime at)
 EditResult EditSession::overwrite(const Placement& what, MTime at)
 {
     return edit(what.clip, [&](EditDraft& draft) {
-        const ClipTiming timing = checkedTiming(draft.timeline(), what, at);
+        const ClipTiming timing = checkedTiming(draft, what, at);
         clearLane(draft, timing);
         lay(draft, what, timing);
     });
@@ -343,8 +349,8 @@ EditResult EditSession::setFades(const Clip* clip, MTime fadeIn, MTime fadeOut)
 
 EditResult EditSession::edit(const Clip* clip, const std::function<void(EditDraft&)>& steps)
 {
-    if (!m_fault.isEmpty()) {
-        return {"The timeline has a fault: " + m_fault, clip};
+    if (!m_refusal.isEmpty()) {
+        return {m_refusal, clip};
     }
     EditDraft draft(*m_timeline);
     try {
@@ -353,9 +359,10 @@ EditResult EditSession::edit(const Clip* clip, const std::function<void(EditDraf
     } catch (const EditRefused& refused) {
         return {refused.why, clip};
     }
-    const QString fault = faultOf(draft.timeline());
+    const QString fault =
+        firstFault("The edit would leave a fault: ", timelineFaults(*m_timeline, draft.timeline()));
     if (!fault.isEmpty()) {
-        return {"The edit would leave a fault: " + fault, clip};
+        return {fault, clip};
     }
     commit(draft);
     return {QString(), clip};
@@ -371,8 +378,8 @@ void EditSession::commit(EditDraft& draft)
 
 void EditSession::changeRequested(Timeline::Object* timeline, Timeline::Object* value)
 {
-    if (timelineFaults(*value).empty()) {
-        m_fault.clear();
+    if (timelineFaults(*timeline, *value).empty()) {
+        m_refusal.clear();
         TimelineView::changeRequested(timeline, value);
     }
 }

@@ -80,7 +80,10 @@ enum class Ripple
 ///
 /// Requests from other modules to change the timeline are granted if they leave no fault; requests to remove
 /// it are refused. What an observer throws passes through the move, which is done then; from the destructor
-/// it ends the process. A timeline has one session at a time.
+/// it ends the process.
+///
+/// A timeline has one session at a time. One that is made for a timeline that any view owns already, that of
+/// another session above all, refuses all moves for good.
 class EditSession : private Message::View<Timeline::Object>
 {
 public:
@@ -101,8 +104,8 @@ public:
     Timeline::Track* makeTrack(TrackType type);
     Transition::Object* makeTransition(const QString& id);
 
-    // Placing a clip that is not on the timeline yet. Refused where the stretch isn't in the source, or the
-    // track can't take the clip.
+    // Placing a clip that is not on the timeline yet, and names no other one. Refused where the stretch isn't
+    // in the source, the track can't take the clip, or the clip shows this timeline, directly or not.
 
     /// At the end of its lane.
     EditResult append(const Placement& what);
@@ -179,8 +182,8 @@ private:
 
     std::unique_ptr<Timeline::Object> m_own;
     Timeline::Object* m_timeline;
-    /// The first fault that the timeline has had from the start; empty for a sound one.
-    QString m_fault;
+    /// Why all moves are refused; empty where they aren't.
+    QString m_refusal;
     /// They outlive the timeline's use of them, since old values name them.
     std::deque<std::unique_ptr<Timeline::Clip>> m_clips;
     std::deque<std::unique_ptr<Timeline::Track>> m_tracks;

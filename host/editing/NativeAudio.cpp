@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "host/editing/NativeAudio.h"
 
+#include "host/editing/TimelineInvariants.h"
+
 #include <algorithm>
 
 namespace Host {
@@ -9,14 +11,14 @@ namespace {
 using Timeline::Clip;
 using Timeline::ClipTiming;
 
-/// The length of the audio's source at the speed of the master.
+/// The length of the audio's source at the speed of the master, at most what a timeline can hold: that of a
+/// clip may be any.
 MTime scaledSource(const Clip* master, const ClipTiming& masterTiming, const Clip* audio)
 {
-    if (master->sourceDuration <= MTime()) {
-        return audio->sourceDuration;
-    }
-    return audio->sourceDuration.mulRound(double(masterTiming.sourceDuration.ms()) /
-                                          double(master->sourceDuration.ms()));
+    const double scale = master->sourceDuration <= MTime()
+                             ? 1.0
+                             : double(masterTiming.sourceDuration.ms()) / double(master->sourceDuration.ms());
+    return std::max(MTime(), std::min(audio->sourceDuration.mulRound(scale), LATEST_TIME));
 }
 
 } // namespace

@@ -2,6 +2,7 @@
 #include "host/editing/TimelineInvariants.h"
 
 #include "host/editing/EditText.h"
+#include "host/editing/NestedTimelines.h"
 
 #include <algorithm>
 #include <functional>
@@ -37,6 +38,7 @@ bool hasTimesInRange(const ClipTiming& timing)
 /// A clip in its lane.
 struct Laid
 {
+    std::size_t trackIndex;
     const Timeline::Track* track;
     int level;
     MTime start;
@@ -46,34 +48,59 @@ struct Laid
     bool isInLaneOf(const Laid& other) const { return track == other.track && level == other.level; }
 };
 
+/// Addresses count only where people have no order.
 bool isBefore(const Laid& a, const Laid& b)
 {
     if (a.track != b.track) {
-        return std::less<const Timeline::Track*>()(a.track, b.track);
+        const std::less<const Timeline::Track*> isLess;
+        return a.trackIndex != b.trackIndex ? a.trackIndex < b.trackIndex : isLess(a.track, b.track);
     }
-    return std::tie(a.level, a.start, a.end) < std::tie(b.level, b.start, b.end);
+    const auto placeA = std::tie(a.level, a.start, a.end);
+    const auto placeB = std::tie(b.level, b.start, b.end);
+    return placeA != placeB ? placeA < placeB : clipText(a.clip) < clipText(b.clip);
 }
 
 class FaultFinder
 {
 public:
-    explicit FaultFinder(const Timeline::Object& timeline) : m_timeline(timeline) {}
+    FaultFinder(const Timeline::Object& identity, const Timeline::Object& timeline)
+        : m_identity(identity), m_timeline(timeline)
+    {}
 
     std::vector<TimelineFault> find()
     {
         findInTracks();
         findInClips();
+        findNesting();
         findOverlaps();
         findInLinks();
         findInTrackings();
         findInTransitions();
         findWrongShares();
-        std::stable_sort(m_faults.begin(), m_faults.end(),
-                         [](const TimelineFault& a, const TimelineFault& b) { return a.kind < b.kind; });
+        std::stable_sort(m_faults.begin(), m_faults.end(), [this](const auto& a, const auto& b) {
+            return a.kind != b.kind ? a.kind < b.kind : placeOf(a.clip) < placeOf(b.clip);
+        });
         return std::move(m_faults);
     }
 
 private:
+    /// By what people order clips; what is not here comes last.
+    using Place = std::tuple<std::size_t, int, MTime, QString>;
+
+    Place placeOf(const Clip* clip) const
+    {
+        const ClipTiming* const timing = timingOf(clip);
+        return timing ? Place(indexOf(timing->track), timing->trackLevel, timing->timestamp, clipText(clip))
+                      : Place(m_trackIndices.size() + 1, 0, 0, QString());
+    }
+
+    /// That of the first place where it is listed; one more than the last for what isn't.
+    std::size_t indexOf(const Timeline::Track* track) const
+    {
+        const auto found = m_trackIndices.find(track);
+        return found == m_trackIndices.end() ? m_trackIndices.size() : found->second;
+    }
+
     void add(Kind kind, const Clip* clip, const QString& text) { m_faults.push_back({kind, clip, text}); }
 
     /// The sentence is one about the clip: "The clip "a" " is put before it.
@@ -90,11 +117,16 @@ private:
 
     void findInTracks()
     {
-        for (auto track = m_timeline.tracks.begin(); track != m_timeline.tracks.end(); ++track) {
-            if (!*track) {
+        for (const Timeline::Track* const track : m_timeline.tracks) {
+            if (!track) {
                 add(Kind::TrackListedTwice, nullptr, "A track of the timeline is null.");
-            } else if (std::find(m_timeline.tracks.begin(), track, *track) != track) {
+            } else if (!m_trackIndices.emplace(track, m_trackIndices.size()).second) {
                 add(Kind::TrackListedTwice, nullptr, "A track of the timeline is listed twice.");
+            } else if (track->timeline != &m_identity) {
+                add(Kind::ForeignTrack, nullptr,
+                    QString("The track %1 names %2 as its timeline.")
+                        .arg(m_trackIndices.size())
+                        .arg(track->timeline ? "another one" : "none"));
             }
         }
     }
@@ -107,10 +139,20 @@ private:
                 add(Kind::NoClip, nullptr, "A clip of the timeline is null.");
                 continue;
             }
-            if (!timing.track || !m_timeline.contains(timing.track)) {
+            if (m_trackIndices.count(timing.track) == 0) {
                 addAbout(Kind::NoTrack, clip, "lies on no track of the timeline.");
             }
             findInTiming(clip, timing);
+            if (clip->nestedTimeline) {
+                m_nesting.push_back(clip);
+            }
+        }
+    }
+
+    void findNesting()
+    {
+        for (const Clip* const clip : endlessClips(m_identity, m_nesting)) {
+            addAbout(Kind::ShowsItself, clip, "shows a timeline that shows itself.");
         }
     }
 
@@ -142,7 +184,8 @@ private:
             addAbout(Kind::TooLongAtEnds, clip,
                      "lasts " + timeText(timing.duration) + ", which is less than its fades.");
         }
-        m_laid.push_back({timing.track, timing.trackLevel, timing.timestamp, timing.end(), clip});
+        m_laid.push_back(
+            {indexOf(timing.track), timing.track, timing.trackLevel, timing.timestamp, timing.end(), clip});
     }
 
     void findOverlaps()
@@ -192,11 +235,22 @@ private:
             slave = m_timeline.masterOf(slave);
         }
         if (way.count(slave) != 0) {
-            const Clip* const present = timingOf(slave) ? slave : nullptr;
+            const Clip* const first = firstOfCircle(slave);
+            const Clip* const present = timingOf(first) ? first : nullptr;
             add(Kind::LinkCycle, present,
                 present ? "The " + clipText(present) + " depends on itself by links."
                         : QString("A clip that is not on the timeline depends on itself by links."));
         }
+    }
+
+    const Clip* firstOfCircle(const Clip* clip) const
+    {
+        const Clip* first = clip;
+        for (const Clip* other = m_timeline.masterOf(clip); other != clip;
+             other = m_timeline.masterOf(other)) {
+            first = placeOf(other) < placeOf(first) ? other : first;
+        }
+        return first;
     }
 
     void findInTrackings()
@@ -278,8 +332,11 @@ private:
         }
     }
 
+    const Timeline::Object& m_identity;
     const Timeline::Object& m_timeline;
     std::vector<TimelineFault> m_faults;
+    std::map<const Timeline::Track*, std::size_t> m_trackIndices;
+    std::vector<const Clip*> m_nesting;
     std::vector<Laid> m_laid;
     std::map<const Clip*, MTime> m_inShares;
     std::map<const Clip*, MTime> m_outShares;
@@ -297,7 +354,12 @@ MTime beyondSource(const Clip* clip, const ClipTiming& timing)
 
 std::vector<TimelineFault> timelineFaults(const Timeline::Object& timeline)
 {
-    return FaultFinder(timeline).find();
+    return timelineFaults(timeline, timeline);
+}
+
+std::vector<TimelineFault> timelineFaults(const Timeline::Object& timeline, const Timeline::Object& value)
+{
+    return FaultFinder(timeline, value).find();
 }
 
 } // namespace Host

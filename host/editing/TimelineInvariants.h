@@ -26,6 +26,8 @@ struct TimelineFault
         TooLongAtEnds,       ///< the transitions, or the fades, of a clip are longer than the clip
         Overlap,             ///< a clip starts before another one on its track and level ends
         TrackListedTwice,    ///< or null is listed as a track
+        ForeignTrack,        ///< a listed track does not name this timeline as its own
+        ShowsItself,         ///< a clip's nested timeline shows itself, if only by way of others
         DanglingLink,        ///< a link names a clip that is not on the timeline
         LinkCycle,           ///< a clip depends on itself
         DanglingTracking,    ///< a tracking link names a clip that is not on the timeline
@@ -51,9 +53,12 @@ MTime beyondSource(const Timeline::Clip* clip, const Timeline::ClipTiming& timin
 /// each by itself.
 constexpr MTime SOURCE_ROUNDING = 1;
 
-/// All faults, in the order of their kinds; empty for a sound timeline. Nothing but clips and tracks that are
-/// listed is looked into, and no time is too wild to be looked at. What cannot be told because of a fault of
-/// an earlier kind is left out: a clip without a duration overlaps nothing.
+/// All faults, in the order of their kinds, and of one kind by the track, the level and the start of the
+/// clip; empty for a sound timeline. Nothing but clips and tracks that are listed, and nested timelines, is
+/// looked into, and no time is too wild to be looked at. What cannot be told because of a fault of an earlier
+/// kind is left out: a clip without a duration overlaps nothing.
 std::vector<TimelineFault> timelineFaults(const Timeline::Object& timeline);
+/// Those that the timeline would have with another value.
+std::vector<TimelineFault> timelineFaults(const Timeline::Object& timeline, const Timeline::Object& value);
 
 } // namespace Host

@@ -176,6 +176,41 @@ TEST_F(EditSessionStructure, TheOffsetOfAForeignLinkChangesByWhatTheClipsMove)
     EXPECT_THAT(links(), ElementsAre("s(4300)>c(4000)+105"));
 }
 
+// Other timelines
+
+TEST_F(EditSessionStructure, AClipOfAnotherTimelineIsRefused)
+{
+    Timeline::Object other;
+    x->setTimeline(&other);
+    refused(session.append({x, primary}), {"\"x\"", "another timeline"});
+    Clip* const xn = sound("xn");
+    xn->setTimeline(&other);
+    x->setTimeline(nullptr);
+    refused(session.append({x, primary, 0, 0, -1, xn}), {"\"xn\"", "another timeline"});
+    xn->setTimeline(session.timeline());
+    done(session.append({x, primary, 0, 0, -1, xn}));
+}
+
+TEST_F(EditSessionStructure, AClipThatShowsItsOwnTimelineIsRefused)
+{
+    x->setNestedTimeline(session.timeline());
+    refused(session.append({x, primary}), {"\"x\"", "show itself"});
+    EditSession other;
+    Track* const track = other.makeTrack(PrimaryTrack);
+    EXPECT_TRUE(other.addTrack(track));
+    Clip* const inner = other.makeClip(Clip::VideoClip);
+    inner->setSourceDuration(5000)->setNestedTimeline(session.timeline());
+    EXPECT_TRUE(other.append({inner, track}));
+    x->setNestedTimeline(other.timeline());
+    refused(session.insert({x, primary}, 0), {"\"x\"", "show itself"});
+    EXPECT_TRUE(other.lift(inner));
+    done(session.append({x, primary}));
+    const EditResult result = other.overwrite({inner, track}, 0);
+    EXPECT_THAT(result.refusal.toStdString(), testing::HasSubstr("show itself"));
+    // The other way round it can be shown twice.
+    done(session.append({picture("y")->setNestedTimeline(other.timeline()), primary}));
+}
+
 // Native audio
 
 class NativeAudioWithSlaves : public EditSessionStructure
@@ -227,6 +262,34 @@ TEST_F(NativeAudioWithSlaves, TakesNativeAudioOfItsOwnAlong)
     EXPECT_EQ(row(second), "yn 4000-4300 @0, yn 4300-4500 @300");
     EXPECT_THAT(links(), ElementsAre("xn(4000)>x(4000)+0", "xn(4300)>x(4300)+0", "yn(4000)>xn(4000)+0",
                                      "yn(4300)>xn(4300)+0"));
+}
+
+TEST_F(EditSessionStructure, NativeAudioIsAsLongAsATimelineAtMost)
+{
+    for (const MTime wild : {std::numeric_limits<qint64>::min(), std::numeric_limits<qint64>::max()}) {
+        refused(session.append({x, primary, 0, 0, 1000, sound("xn", wild)}),
+                {"more than a timeline can hold"});
+    }
+    Clip* const xn = sound("xn");
+    done(session.append({x, primary, 0, 0, 1000, xn}));
+    xn->setSourceDuration(std::numeric_limits<qint64>::max());
+    done(session.trimRight(x, 100));
+    EXPECT_EQ(row(native), "xn 4000-4900 @0");
+    xn->setSourceDuration(std::numeric_limits<qint64>::min());
+    done(session.trimRight(x, 100));
+    EXPECT_EQ(row(native), "");
+}
+
+TEST_F(EditSessionStructure, OfSeveralClipsThatStandInTheWayTheFirstIsNamed)
+{
+    std::vector<Clip*> intros;
+    for (int i = 0; i != 8; ++i) {
+        Clip* const intro = picture("intro");
+        lay(intro, extra, 100 * (8 - i), 100);
+        intros.push_back(intro->setType(Clip::IntroVideoClip));
+    }
+    refused(session.insert({x, extra}, 0), {"00:00:00.100 would have to move"});
+    refused(session.overwrite({x, extra, 0, 0, 500}, 350), {"at 00:00:00.300 is part of an intro"});
 }
 
 TEST_F(NativeAudioWithSlaves, GoesWithNativeAudioOfItsOwn)
@@ -314,6 +377,36 @@ TEST(EditSession, OthersHearOfTheTimelinesEnd)
     EXPECT_FALSE(watcher.isRemoved);
     session.reset();
     EXPECT_TRUE(watcher.isRemoved);
+}
+
+TEST(EditSession, ATimelineHasOneSessionAtATime)
+{
+    EditSession first;
+    Track* const track = first.makeTrack(PrimaryTrack);
+    Watcher watcher(first.timeline());
+    {
+        EditSession second(const_cast<Timeline::Object*>(first.timeline()));
+        const EditResult result = second.addTrack(track);
+        EXPECT_EQ(result.refusal, "The timeline is edited by somebody else.");
+        EXPECT_EQ(second.timeline(), first.timeline());
+    }
+    EXPECT_FALSE(watcher.isRemoved);
+    EXPECT_EQ(watcher.changes, 0);
+    EXPECT_TRUE(first.addTrack(track));
+    EXPECT_EQ(watcher.changes, 1);
+}
+
+TEST(EditSession, FollowsAnotherOneOnItsTimeline)
+{
+    Timeline::Object timeline;
+    Track track(PrimaryTrack);
+    track.setTimeline(&timeline);
+    {
+        EditSession first(&timeline);
+        EXPECT_TRUE(first.addTrack(&track));
+    }
+    EditSession second(&timeline);
+    EXPECT_TRUE(second.removeTrack(&track));
 }
 
 TEST(EditSession, EditsATimelineOfTheCaller)

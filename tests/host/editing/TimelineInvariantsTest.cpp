@@ -2,6 +2,7 @@
 #include "Edits.h"
 
 #include <limits>
+#include <utility>
 
 namespace {
 
@@ -19,7 +20,7 @@ protected:
         a.setName("a")->setSourceDuration(5000);
         b.setName("b")->setSourceDuration(5000);
         s.setName("s")->setSourceDuration(5000);
-        t.addTrack(&primary)->addTrack(&title);
+        t.addTrack(primary.setTimeline(&t))->addTrack(title.setTimeline(&t));
         t.addClip(&a, ClipTiming(&primary, 0, 0, 1000, 0, 5000));
         t.addClip(&b, ClipTiming(&primary, 0, 1000, 1000, 0, 5000));
         t.addClip(&s, ClipTiming(&title, 0, 1200, 500, 0, 5000));
@@ -76,6 +77,92 @@ TEST_F(TimelineFaults, ATrackIsListedOnce)
     EXPECT_THAT(kinds(), ElementsAre(TimelineFault::TrackListedTwice));
     t.removeTrack(&primary)->addTrack(&primary)->addTrack(nullptr);
     EXPECT_THAT(kinds(), ElementsAre(TimelineFault::TrackListedTwice));
+}
+
+TEST_F(TimelineFaults, ATrackNamesItsTimeline)
+{
+    Timeline::Object other_;
+    for (const Timeline::Object* const wrong :
+         {static_cast<const Timeline::Object*>(nullptr), &std::as_const(other_)}) {
+        title.setTimeline(wrong);
+        EXPECT_THAT(kinds(), ElementsAre(TimelineFault::ForeignTrack));
+    }
+    title.setTimeline(&t);
+    EXPECT_THAT(kinds(), IsEmpty());
+    EXPECT_THAT(Host::timelineFaults(t, Timeline::Object(t)), IsEmpty());
+    EXPECT_THAT(Host::timelineFaults(Timeline::Object(t)), testing::SizeIs(2));
+}
+
+TEST_F(TimelineFaults, NoTimelineShowsItself)
+{
+    Timeline::Object inner, innermost;
+    Clip showsInnermost, showsMore;
+    b.setNestedTimeline(&inner);
+    s.setNestedTimeline(&innermost);
+    inner.addClip(&showsInnermost, ClipTiming())->addClip(nullptr, ClipTiming());
+    showsInnermost.setNestedTimeline(&innermost);
+    innermost.addClip(&showsMore, ClipTiming());
+    EXPECT_THAT(kinds(), IsEmpty());
+    // By way of two others, and of one.
+    showsMore.setNestedTimeline(&t);
+    EXPECT_THAT(kinds(), ElementsAre(TimelineFault::ShowsItself, TimelineFault::ShowsItself));
+    // Neither can another one that it shows.
+    showsMore.setNestedTimeline(&innermost);
+    EXPECT_THAT(kinds(), ElementsAre(TimelineFault::ShowsItself, TimelineFault::ShowsItself));
+    showsMore.setNestedTimeline(nullptr);
+    a.setNestedTimeline(&t);
+    EXPECT_THAT(kinds(), ElementsAre(TimelineFault::ShowsItself));
+}
+
+TEST_F(TimelineFaults, AreOrderedByTrackLevelAndStart)
+{
+    std::vector<Clip> clips(40);
+    t.addClip(&s, ClipTiming(&title, 1, 0, 0, 0, 5000));
+    const auto names = [this] {
+        std::vector<std::string> found;
+        for (const TimelineFault& fault : Host::timelineFaults(t)) {
+            found.push_back(fault.clip->name.toStdString());
+        }
+        return found;
+    };
+    // All lack a duration. The later their addresses, the earlier they start.
+    std::vector<std::string> expected;
+    for (int i = 0; i != 40; ++i) {
+        clips[i].setName(QString::number(i))->setSourceDuration(5000);
+        t.addClip(&clips[i], ClipTiming(&title, 0, 9000 - 10 * i, 0, 0, 5000));
+        expected.insert(expected.begin(), std::to_string(i));
+    }
+    expected.push_back("s");
+    t.removeTransition(&between)->setClipDuration(&b, 0);
+    expected.insert(expected.begin(), "b");
+    EXPECT_EQ(names(), expected);
+}
+
+TEST_F(TimelineFaults, OfSeveralAtOnePlaceTheNamesDecide)
+{
+    std::vector<Clip> clips(8);
+    for (int i = 0; i != 8; ++i) {
+        clips[i].setName(QString(QChar('q' - i)))->setSourceDuration(5000);
+        t.addClip(&clips[i], ClipTiming(&title, 0, 3000, 100, 0, 5000));
+    }
+    // All but the first are before its end.
+    std::string named;
+    for (const TimelineFault& fault : Host::timelineFaults(t)) {
+        named += fault.clip->name.toStdString();
+        EXPECT_TRUE(fault.text.contains("before the clip \"j\"")) << fault.text.toStdString();
+    }
+    EXPECT_EQ(named, "klmnopq");
+    // Of a circle the first one is named.
+    t.clips.clear();
+    t.links.clear();
+    t.trackingLinks.clear();
+    t.transitions.clear();
+    for (int i = 0; i != 8; ++i) {
+        t.addClip(&clips[i], ClipTiming(&title, 0, 8000 - 1000 * i, 100, 0, 5000));
+        t.addLink(&clips[i], &clips[(i + 1) % 8], 0);
+    }
+    ASSERT_THAT(kinds(), ElementsAre(TimelineFault::LinkCycle));
+    EXPECT_EQ(Host::timelineFaults(t).front().clip, &clips[7]);
 }
 
 TEST_F(TimelineFaults, TimesAreNeitherNegativeNorTooLate)
