@@ -2,10 +2,9 @@
 #include "host/media/ResourceKeeper.h"
 
 #include "host/media/AddingFailed.h"
+#include "host/media/FileFacts.h"
 #include "host/media/MediaDescriber.h"
 
-#include <QDir>
-#include <QFileInfo>
 #include <QUuid>
 
 #include <algorithm>
@@ -16,31 +15,13 @@
 namespace Host {
 namespace {
 
-/// As the system walks it: ".." behind a link leads out of the folder that the link names.
-QString absolute(const QString& path)
-{
-    const QString whole = path.startsWith('/') ? path : QDir::currentPath() + '/' + path;
-    QString walked;
-    for (const QString& step : whole.split('/')) {
-        if (step == "..") {
-            const QFileInfo last(walked);
-            const QString target = last.isSymLink() ? last.canonicalFilePath() : QString();
-            walked = target.isEmpty() ? walked : target;
-            walked.truncate(std::max(0, walked.lastIndexOf('/')));
-        } else if (!step.isEmpty() && step != ".") {
-            walked += '/' + step;
-        }
-    }
-    return walked.isEmpty() ? QString("/") : walked;
-}
-
 /// The files that are open, whoever owns them, by their absolute paths.
 std::map<QString, const Media::File*> openFiles()
 {
     std::map<QString, const Media::File*> files;
     for (const Media::File* file : Message::View<Media::File>().enumerateAll()) {
         if (file->isOpened) {
-            files.emplace(absolute(file->path), file);
+            files.emplace(absolutePath(file->path), file);
         }
     }
     return files;
@@ -75,7 +56,7 @@ ResourceKeeper::~ResourceKeeper() = default;
 QString ResourceKeeper::identifier(const QString& path, int index)
 {
     static const QUuid space("7a3c52c8-6d1e-4f0b-9d43-5b8a1c0e2f96");
-    const QString file = QUuid::createUuidV5(space, absolute(path)).toString(QUuid::WithoutBraces);
+    const QString file = QUuid::createUuidV5(space, absolutePath(path)).toString(QUuid::WithoutBraces);
     return index == 0 ? file : file + '-' + QString::number(index);
 }
 
@@ -139,7 +120,7 @@ ResourceKeeper::Found ResourceKeeper::describe(const Table* table, const QString
     std::set<QString> done;
     QStringList closed;
     for (const QString& path : paths) {
-        const QString place = absolute(path);
+        const QString place = absolutePath(path);
         if (!done.insert(place).second) {
             continue;
         }
@@ -172,7 +153,7 @@ void ResourceKeeper::addTracks(const Media::File& file, Found& found)
     const auto add = [&](const Media::File::Track& track, Resource::Type type) {
         const ResourceRef resource(identifier(file.path, counts[type]++), type);
         ResourceTable::FileResourceInfo& info = found.infos[resource];
-        info.info.path = absolute(file.path);
+        info.info.path = absolutePath(file.path);
         info.info.track = track.index;
         info.info.duration = type == Resource::ImageType ? MTime() : file.length;
         info.timing.mode = type == Resource::ImageType ? Resource::Timing::Described : PlayedOnce;
