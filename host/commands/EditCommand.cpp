@@ -3,6 +3,7 @@
 
 #include "host/commands/Refusal.h"
 #include "host/editing/EditScript.h"
+#include "host/media/MediaOpener.h"
 #include "host/project/ProjectDocument.h"
 
 namespace Host {
@@ -50,6 +51,7 @@ ExitCode editProject(const QString& path, const QStringList& words)
 {
     return unlessRefused([&] {
         const ProjectDocument document = ProjectDocument::load(path);
+        const MediaOpener opener;
         EditSession session(&document.timeline());
         EditScript script(session);
         for (const QStringList& command : commandsOf(words)) {

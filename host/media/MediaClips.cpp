@@ -2,68 +2,149 @@
 #include "host/media/MediaClips.h"
 
 #include "host/commands/Refusal.h"
+#include "host/media/FileFacts.h"
 
 #include <QFileInfo>
 
 #include <algorithm>
+#include <vector>
 
 namespace Host {
 namespace {
 
 using Timeline::Clip;
+using Timeline::Track;
 
-/// Null unless the file has a track of moving pictures; cover art is none.
-const Media::File::Track::Video* movingPicture(const Media::File& file)
+/// What of a file is to be laid.
+struct Parts
 {
-    const auto found = std::find_if(file.videoTracks.begin(), file.videoTracks.end(),
-                                    [](const auto* track) { return !track->isImage; });
-    return found == file.videoTracks.end() ? nullptr : *found;
+    bool picture;
+    bool sound;
+};
+
+Parts partsOf(const QString& path, MediaClips::Strategy strategy, Clip::ClipType type)
+{
+    const bool isKnown = strategy == MediaClips::PictureWithSound || strategy == MediaClips::PictureAlone ||
+                         strategy == MediaClips::SoundAlone;
+    if (!isKnown) {
+        throw Refusal(path, QString("cannot be laid: clips aren't built by strategy %1").arg(strategy));
+    }
+    if (type != Clip::ClipType() && type != Clip::VideoClip && type != Clip::AudioClip) {
+        throw Refusal(path, QString("cannot become a clip of type %1").arg(type));
+    }
+    const Parts parts = {strategy != MediaClips::SoundAlone && type != Clip::AudioClip,
+                         strategy != MediaClips::PictureAlone};
+    const bool isContradiction =
+        (type == Clip::VideoClip && !parts.picture) || (type == Clip::AudioClip && !parts.sound);
+    if (isContradiction) {
+        throw Refusal(path, "cannot be laid: the clip would be without what makes its type");
+    }
+    return parts;
 }
 
 /// Sound that stands alone takes the audio track that is not linked to the picture.
-const Timeline::Track* trackOf(const Timeline::Object& timeline, TrackType type)
+const Track* trackOf(const Timeline::Object& timeline, TrackType type)
 {
-    const Timeline::Track* const detached = type == AudioTrack ? timeline.detachedAudioTrack() : nullptr;
+    const Track* const detached = type == AudioTrack ? timeline.detachedAudioTrack() : nullptr;
     return detached ? detached : timeline.findFirstTrack(type);
 }
 
-EditResult provideTrack(EditSession& session, TrackType type)
+/// The tracks that are made for clips.
+class MissingTracks
 {
-    if (trackOf(*session.timeline(), type)) {
-        return {};
+public:
+    explicit MissingTracks(EditSession& session) : m_session(session) {}
+
+    EditResult provide(TrackType type)
+    {
+        if (trackOf(*m_session.timeline(), type)) {
+            return {};
+        }
+        const Track* const track = m_session.makeTrack(type);
+        EditResult added = m_session.addTrack(track);
+        if (added) {
+            m_made.push_back(track);
+        }
+        return added;
     }
-    return session.addTrack(session.makeTrack(type));
+
+    /// Those that others have laid something on by now stay.
+    void takeBack()
+    {
+        for (auto track = m_made.rbegin(); track != m_made.rend(); ++track) {
+            if (!isUsed(*track) && !m_session.removeTrack(*track)) {
+                break;
+            }
+        }
+    }
+
+private:
+    bool isUsed(const Track* track) const
+    {
+        const auto& clips = m_session.timeline()->clips;
+        return std::any_of(clips.begin(), clips.end(),
+                           [track](const auto& entry) { return entry.second.track == track; });
+    }
+
+    EditSession& m_session;
+    std::vector<const Track*> m_made;
+};
+
+EditResult place(EditSession& session, const MediaClips::Clips& clips, const LayingPlace& where)
+{
+    const Track* const track = where.track ? where.track : trackOf(*session.timeline(), clips.track);
+    Placement placement(clips.clip, track, where.level);
+    placement.nativeAudio = clips.nativeAudio;
+    return where.at ? session.insert(placement, *where.at) : session.append(placement);
 }
 
 } // namespace
 
+const MediaDescriber::Entry& MediaClips::open(const QString& path)
+{
+    const QString whole = path.isEmpty() ? path : absolutePath(path);
+    for (const MediaDescriber::Entry& entry : m_describer.entries()) {
+        if (entry.file.isOpened && entry.file.path == whole) {
+            return entry;
+        }
+    }
+    return m_describer.describe(whole);
+}
+
 MediaClips::Clips MediaClips::make(const QString& path)
 {
-    // A project is to find its media from any folder.
-    const QString place = path.isEmpty() ? path : QFileInfo(path).absoluteFilePath();
-    const MediaDescriber::Entry& entry = m_describer.describe(place);
-    const Media::File& file = entry.file;
-    if (!file.isOpened) {
+    const MediaDescriber::Entry& entry = open(path);
+    if (!entry.file.isOpened) {
         throw Refusal(path, entry.reason);
     }
-    const auto* const video = movingPicture(file);
-    const auto* const audio = file.audioTracks.empty() ? nullptr : file.audioTracks.front();
-    if ((video || audio) && !(file.length > MTime())) {
+    return make(entry.file);
+}
+
+MediaClips::Clips MediaClips::make(const Media::File& file, Strategy strategy, Clip::ClipType type)
+{
+    const QString& path = file.path;
+    const Parts parts = partsOf(path, strategy, type);
+    const auto* const video = parts.picture ? movingPicture(file) : nullptr;
+    const auto* const audio = parts.sound && !file.audioTracks.empty() ? file.audioTracks.front() : nullptr;
+    const bool isSound = audio && !video && type != Clip::VideoClip;
+    const auto* const still = parts.picture && !video && !isSound ? stillPicture(file) : nullptr;
+    if (!video && !isSound && !still) {
+        const bool wantsBoth = parts.picture && parts.sound && type != Clip::VideoClip;
+        throw Refusal(path, wantsBoth       ? "has neither picture nor sound"
+                            : parts.picture ? "has no picture"
+                                            : "has no sound");
+    }
+    if (still) {
+        return {makeStill(file, still->index), PrimaryTrack, nullptr};
+    }
+    if (!(file.length > MTime())) {
         throw Refusal(path, "does not tell how long it is");
     }
-    if (video) {
-        return {makeClip(file, Clip::VideoClip, video->index), PrimaryTrack,
-                audio ? makeClip(file, Clip::AudioClip, audio->index) : nullptr};
-    }
-    if (audio) {
+    if (isSound) {
         return {makeClip(file, Clip::AudioClip, audio->index), AudioTrack, nullptr};
     }
-    if (file.videoTracks.empty()) {
-        throw Refusal(path, "has neither picture nor sound");
-    }
-    Clip* const picture = makeClip(file, Clip::VideoClip, file.videoTracks.front()->index);
-    picture->setUnlimitedDuration(true)->setSourceDuration(Clip::DEFAULT_IMAGE_CLIP_DURATION);
-    return {picture, PrimaryTrack, nullptr};
+    return {makeClip(file, Clip::VideoClip, video->index), PrimaryTrack,
+            audio ? makeClip(file, Clip::AudioClip, audio->index) : nullptr};
 }
 
 Clip* MediaClips::makeClip(const Media::File& file, Clip::ClipType type, int mediaTrack)
@@ -74,18 +155,36 @@ Clip* MediaClips::makeClip(const Media::File& file, Clip::ClipType type, int med
     return clip;
 }
 
+Clip* MediaClips::makeStill(const Media::File& file, int mediaTrack)
+{
+    Clip* const clip = makeClip(file, Clip::VideoClip, mediaTrack);
+    clip->setUnlimitedDuration(true)->setSourceDuration(Clip::DEFAULT_IMAGE_CLIP_DURATION);
+    return clip;
+}
+
+EditResult lay(EditSession& session, const MediaClips::Clips& clips, const LayingPlace& where)
+{
+    MissingTracks missing(session);
+    EditResult result = where.track ? EditResult() : missing.provide(clips.track);
+    if (result && clips.nativeAudio) {
+        result = missing.provide(NativeAudioTrack);
+    }
+    if (result) {
+        result = place(session, clips, where);
+    }
+    if (!result) {
+        missing.takeBack();
+    }
+    return result;
+}
+
 EditResult lay(EditSession& session, const MediaClips::Clips& clips, const MTime* at)
 {
-    EditResult provided = provideTrack(session, clips.track);
-    if (provided && clips.nativeAudio) {
-        provided = provideTrack(session, NativeAudioTrack);
+    LayingPlace where;
+    if (at) {
+        where.at = *at;
     }
-    if (!provided) {
-        return provided;
-    }
-    Placement placement(clips.clip, trackOf(*session.timeline(), clips.track));
-    placement.nativeAudio = clips.nativeAudio;
-    return at ? session.insert(placement, *at) : session.append(placement);
+    return lay(session, clips, where);
 }
 
 } // namespace Host
