@@ -83,12 +83,12 @@ TEST(TrackingFrame, IsValidWithinThePicture)
         bool isValid;
     };
     const Case cases[] = {
-        {0.0, 1.0, true},          {0.5, 0.5, true},   {0.25, 0.75, true},         {0.0, 1e-300, true},
-        {justBelow1, 1e-17, true}, {-0.0, 1.0, true},  {0.5, 0.6, false},          {1.0, 0.0, false},
-        {1.0, 0.1, false},         {1.5, 0.1, false},  {-1e-17, 0.5, false},       {-0.5, 0.5, false},
-        {0.0, 0.0, false},         {0.5, -0.1, false}, {0.0, justAbove1, false},   {0.5, justAbove1, false},
-        {justBelow1, 0.5, false},  {0.5, 1.0, false},  {justBelow1, 1e-15, false}, {notANumber, 0.5, false},
-        {0.5, notANumber, false},
+        {0.0, 1.0, true},          {0.5, 0.5, true},         {0.25, 0.75, true}, {0.0, 1e-300, true},
+        {justBelow1, 1e-17, true}, {-0.0, 1.0, true},        {0.5, 0.6, false},  {1.0, 0.0, false},
+        {1.0, 0.1, false},         {1.0, 1e-17, false},      {1.5, 0.1, false},  {-1e-17, 0.5, false},
+        {-0.5, 0.5, false},        {0.0, 0.0, false},        {0.5, -0.1, false}, {0.0, justAbove1, false},
+        {0.5, justAbove1, false},  {justBelow1, 0.5, false}, {0.5, 1.0, false},  {justBelow1, 1e-15, false},
+        {notANumber, 0.5, false},  {0.5, notANumber, false},
     };
     for (const Case& c : cases) {
         EXPECT_EQ(Frame(c.place, 0, c.extent, 1).isValid(), c.isValid) << c.place << ", " << c.extent;

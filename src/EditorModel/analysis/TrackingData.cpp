@@ -50,8 +50,7 @@ bool Frame::isNull() const
 bool Frame::isValid() const
 {
     const auto isPlace = [](double position) { return 0.0 <= position && position < 1.0; };
-    const auto isExtent = [](double extent) { return 0.0 < extent && extent <= 1.0; };
-    return isPlace(left) && isPlace(top) && isExtent(width) && isExtent(height) && left + width <= 1.0 &&
+    return isPlace(left) && isPlace(top) && width > 0.0 && height > 0.0 && left + width <= 1.0 &&
            top + height <= 1.0;
 }
 

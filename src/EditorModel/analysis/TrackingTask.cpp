@@ -67,9 +67,8 @@ bool AnalyzeTask::isValid() const
 {
     const auto& [id, kind] = resource;
     const Types::Range& range = analyzingRange;
-    return !id.isEmpty() && kind == Resource::VideoType && initialFrame.isValid() &&
-           initialPosition >= MTime() && range.from >= MTime() && !range.empty() &&
-           range.from <= initialPosition && initialPosition <= range.to;
+    return !id.isEmpty() && kind == Resource::VideoType && initialFrame.isValid() && range.from >= MTime() &&
+           !range.empty() && range.from <= initialPosition && initialPosition <= range.to;
 }
 
 } // namespace MotionTracking
