@@ -10,13 +10,16 @@
 namespace Host {
 namespace {
 
+/// So much may be wrong with a project that it isn't known for one.
 Document::Graph plainDocument(const QString& path)
 {
     try {
         return loadDocument(path);
     } catch (const Document::Error& error) {
-        // So much may be wrong with a project that it isn't known for one.
-        throw ProjectStore::withBackup(path, error);
+        throw Document::Error(error.form(), error.place(), error.reason() + ProjectStore::backupHint(path));
+    } catch (const Refusal& refusal) {
+        const std::string hint = ProjectStore::backupHint(path);
+        throw Refusal(path, refusal.reason + QString::fromStdString(hint));
     }
 }
 
@@ -32,7 +35,8 @@ ProjectDocument ProjectDocument::load(const QString& path)
     Document::Graph graph = plainDocument(path);
     if (graph.rootAs<Project::Content>()) {
         // Nothing would tell that such a project is damaged.
-        throw Refusal(path, "holds a project without its checksum");
+        throw Refusal(path, "holds a project without its checksum" +
+                                QString::fromStdString(ProjectStore::backupHint(path)));
     }
     return ProjectDocument(path, std::move(graph), nullptr);
 }

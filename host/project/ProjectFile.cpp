@@ -176,7 +176,7 @@ bool isJsonProject(const QByteArray& begin)
 /// Without its last line a project still says what its root is.
 bool isXmlProject(const QByteArray& begin, const QByteArray& end)
 {
-    return begin.startsWith("<?xml") && !begin.contains("<!DOCTYPE") &&
+    return begin.startsWith('<') && !begin.contains("<!DOCTYPE") &&
            (begin.contains("class=\"Project::Content\"") || end.contains(xmlTag));
 }
 

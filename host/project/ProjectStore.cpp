@@ -108,7 +108,7 @@ OpenedProject openedOrHint(const QString& path)
     try {
         return opened(path);
     } catch (const Document::Error& error) {
-        throw ProjectStore::withBackup(path, error);
+        throw Document::Error(error.form(), error.place(), error.reason() + ProjectStore::backupHint(path));
     }
 }
 
@@ -154,14 +154,10 @@ OpenedProject ProjectStore::openBackup(const QString& path)
     return project;
 }
 
-Document::Error ProjectStore::withBackup(const QString& path, const Document::Error& error)
+std::string ProjectStore::backupHint(const QString& path)
 {
     const QString backup = backupOf(path);
-    if (!opens(backup)) {
-        return error;
-    }
-    return Document::Error(error.form(), error.place(),
-                           error.reason() + "; its backup " + backup.toStdString() + " can be opened");
+    return opens(backup) ? "; its backup " + backup.toStdString() + " can be opened" : std::string();
 }
 
 bool ProjectStore::isProject(const QString& path)

@@ -6,6 +6,7 @@
 
 #include <QString>
 
+#include <string>
 #include <utility>
 
 namespace Host {
@@ -46,8 +47,8 @@ public:
     static bool isProject(const QString& path);
     /// Where save() keeps the old file.
     static QString backupOf(const QString& path);
-    /// The error, and in its reason the backup of the file if that can be opened.
-    static Document::Error withBackup(const QString& path, const Document::Error& error);
+    /// What to say behind the reason why a file cannot be opened: that its backup can, or nothing.
+    static std::string backupHint(const QString& path);
 };
 
 } // namespace Host
