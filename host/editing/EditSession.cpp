@@ -6,6 +6,7 @@
 #include "host/editing/EditText.h"
 #include "host/editing/TimelineInvariants.h"
 
+#include <EditorModel/effects/Overlay.h>
 #include <EditorModel/effects/Transition.h>
 
 #include <algorithm>
@@ -117,7 +118,7 @@ void takeIntoSource(const Clip* clip, ClipTiming& timing)
 }
 
 /// Lets the clips behind follow a clip that has got another length.
-void follow(EditDraft& draft, const Clip* clip, const ClipTiming& before, Ripple ripple)
+void followLength(EditDraft& draft, const Clip* clip, const ClipTiming& before, Ripple ripple)
 {
     draft.noteRetimed(clip);
     if (ripple == Ripple::Yes) {
@@ -175,6 +176,12 @@ Transition::Object* EditSession::makeTransition(const QString& id)
 {
     m_transitions.push_back(std::make_unique<Transition::Object>(id));
     return m_transitions.back().get();
+}
+
+Overlay::Preset* EditSession::makeOverlay(const Overlay::Preset& preset)
+{
+    m_overlays.push_back(std::make_unique<Overlay::Preset>(preset));
+    return m_overlays.back().get();
 }
 
 // Placing
@@ -259,7 +266,7 @@ EditResult EditSession::trimLeft(const Clip* clip, MTime delta, Ripple ripple)
         }
         checkLength(clip, before.timestamp, timing.duration);
         checkStretch(clip, timing, beyondSource(clip, before));
-        follow(draft, clip, before, ripple);
+        followLength(draft, clip, before, ripple);
     });
 }
 
@@ -273,7 +280,7 @@ EditResult EditSession::trimRight(const Clip* clip, MTime delta, Ripple ripple)
         timing.resizeRight(-delta);
         checkLength(clip, before.timestamp, timing.duration);
         checkStretch(clip, timing, beyondSource(clip, before));
-        follow(draft, clip, before, ripple);
+        followLength(draft, clip, before, ripple);
     });
 }
 
@@ -315,7 +322,7 @@ EditResult EditSession::setSpeed(const Clip* clip, double speed, Ripple ripple)
         timing.duration -= beyondSource(clip, timing);
         checkLength(clip, before.timestamp, timing.duration);
         checkStretch(clip, timing);
-        follow(draft, clip, before, ripple);
+        followLength(draft, clip, before, ripple);
     });
 }
 

@@ -10,6 +10,9 @@
 #include <functional>
 #include <memory>
 
+namespace Overlay {
+class Preset;
+}
 namespace Transition {
 class Object;
 }
@@ -103,6 +106,8 @@ public:
     Timeline::Clip* makeClip(Timeline::Clip::ClipType type);
     Timeline::Track* makeTrack(TrackType type);
     Transition::Object* makeTransition(const QString& id);
+    /// A copy that belongs to the session, for its clips to show.
+    Overlay::Preset* makeOverlay(const Overlay::Preset& preset);
 
     // Placing a clip that is not on the timeline yet, and names no other one. Refused where the stretch isn't
     // in the source, the track can't take the clip, or the clip shows this timeline, directly or not.
@@ -170,6 +175,14 @@ public:
     EditResult link(const Timeline::Clip* master, const Timeline::Clip* slave);
     EditResult unlink(const Timeline::Clip* slave);
 
+    // Tracking links
+
+    /// The clip follows what a tracking has found in another one, and no longer what it followed before.
+    /// Refused for sound, where the other clip doesn't list the tracking, and where that one follows the clip
+    /// in turn.
+    EditResult follow(const Timeline::Clip* clip, const Timeline::TrackingLinkInfo& info);
+    EditResult unfollow(const Timeline::Clip* clip);
+
 private:
     using TimelineView = Message::View<Timeline::Object>;
 
@@ -188,6 +201,7 @@ private:
     std::deque<std::unique_ptr<Timeline::Clip>> m_clips;
     std::deque<std::unique_ptr<Timeline::Track>> m_tracks;
     std::deque<std::unique_ptr<Transition::Object>> m_transitions;
+    std::deque<std::unique_ptr<Overlay::Preset>> m_overlays;
 };
 
 } // namespace Host

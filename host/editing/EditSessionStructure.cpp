@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// What an edit session does to transitions, tracks and links.
+// What an edit session does to transitions, tracks, links and tracking links.
 #include "host/editing/EditSession.h"
 
 #include "host/editing/EditChecks.h"
@@ -9,6 +9,8 @@
 #include <EditorModel/effects/Transition.h>
 
 #include <algorithm>
+#include <cmath>
+#include <set>
 
 namespace Host {
 namespace {
@@ -81,6 +83,43 @@ bool dependsOn(const Timeline::Object& timeline, const Clip* clip, const Clip* m
 {
     const std::deque<const Clip*> heap = timeline.clipHeap(master);
     return std::find(heap.begin(), heap.end(), clip) != heap.end();
+}
+
+/// By tracking links, of which other modules may have made a circle.
+bool follows(const Timeline::Object& timeline, const Clip* clip, const Clip* followed)
+{
+    std::set<const Clip*> way;
+    while (clip != followed && way.insert(clip).second) {
+        const Timeline::TrackingLinkInfo* const link = timeline.getTrackingLink(clip);
+        if (!link) {
+            return false;
+        }
+        clip = link->trackedObject.clip;
+    }
+    return clip == followed;
+}
+
+void checkFollowing(const Timeline::Object& timeline, const Clip* clip,
+                    const Timeline::TrackingLinkInfo& info)
+{
+    const Clip* const followed = info.trackedObject.clip;
+    checkPresent(timeline, clip);
+    checkPresent(timeline, followed);
+    const QString start = "The " + clipText(clip) + " at " + timeText(timeline.clipTiming(clip).timestamp);
+    if (clip->isAudioClip()) {
+        throw EditRefused{start + " is sound, which has no place to follow with."};
+    }
+    if (follows(timeline, followed, clip)) {
+        throw EditRefused{start + " can't follow the " + clipText(followed) + ", which follows it."};
+    }
+    if (followed->motionTrackings.count(info.trackedObject.trackingId) == 0) {
+        throw EditRefused{start + " can't follow \"" + info.trackedObject.trackingId + "\": the " +
+                          clipText(followed) + " has no such tracking."};
+    }
+    const QPointF offset = info.objectRelativeOffset;
+    if (!std::isfinite(offset.x()) || !std::isfinite(offset.y())) {
+        throw EditRefused{start + " can't follow at an offset that is no number."};
+    }
 }
 
 } // namespace
@@ -179,6 +218,28 @@ EditResult EditSession::unlink(const Clip* slave)
             checkEditable(draft.timeline(), slave);
         }
         draft.unlink(slave);
+    });
+}
+
+// Tracking links
+
+EditResult EditSession::follow(const Clip* clip, const Timeline::TrackingLinkInfo& info)
+{
+    return edit(clip, [&](EditDraft& draft) {
+        checkFollowing(draft.timeline(), clip, info);
+        draft.timeline().addTrackingLink(clip, info);
+    });
+}
+
+EditResult EditSession::unfollow(const Clip* clip)
+{
+    return edit(clip, [&](EditDraft& draft) {
+        checkPresent(draft.timeline(), clip);
+        if (!draft.timeline().getTrackingLink(clip)) {
+            throw EditRefused{"The " + clipText(clip) + " at " + timeText(draft.timing(clip).timestamp) +
+                              " follows no other clip."};
+        }
+        draft.timeline().removeTrackingLink(clip);
     });
 }
 

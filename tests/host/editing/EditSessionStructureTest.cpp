@@ -176,6 +176,63 @@ TEST_F(EditSessionStructure, TheOffsetOfAForeignLinkChangesByWhatTheClipsMove)
     EXPECT_THAT(links(), ElementsAre("s(4300)>c(4000)+105"));
 }
 
+// Tracking links
+
+class Following : public EditSessionStructure
+{
+protected:
+    Following()
+    {
+        lay(s, title, 1200, 500);
+        b->addMotionTracking("face")->addMotionTracking("hand");
+    }
+
+    Clip* s = overlay("s");
+};
+
+TEST_F(Following, AClipFollowsWhatIsTrackedInAnotherOne)
+{
+    done(session.follow(s, Timeline::TrackingLinkInfo({b, "face"}, QPointF(0.25, -1))));
+    done(session.follow(s, Timeline::TrackingLinkInfo({b, "hand"}, QPointF(0.5, 2))));
+    const Timeline::TrackingLinkInfo* const link = now().getTrackingLink(s);
+    ASSERT_TRUE(link);
+    EXPECT_EQ(link->trackedObject.clip, b);
+    EXPECT_EQ(link->trackedObject.trackingId, "hand");
+    EXPECT_EQ(link->objectRelativeOffset, QPointF(0.5, 2));
+    done(session.unfollow(s));
+    EXPECT_THAT(now().trackingLinks, IsEmpty());
+    refused(session.unfollow(s), {"\"s\"", "00:00:01.200", "follows no other clip"});
+}
+
+TEST_F(Following, IsRefusedWhereThereIsNothingToFollow)
+{
+    const auto face = [](const Clip* clip) { return Timeline::TrackingLinkInfo({clip, "face"}, QPointF()); };
+    refused(session.follow(s, face(a)), {"\"s\"", "\"face\"", "\"a\"", "no such tracking"});
+    refused(session.follow(s, face(nullptr)), {"no clip"});
+    refused(session.follow(s, face(x)), {"\"x\"", "not on the timeline"});
+    refused(session.follow(x, face(b)), {"\"x\"", "not on the timeline"});
+    refused(session.unfollow(x), {"\"x\"", "not on the timeline"});
+    Clip* const n = sound("n");
+    lay(n, audio, 0, 1000);
+    refused(session.follow(n, face(b)), {"\"n\"", "sound"});
+    const double nan = std::numeric_limits<double>::quiet_NaN();
+    refused(session.follow(s, Timeline::TrackingLinkInfo({b, "face"}, QPointF(0, nan))), {"\"s\"", "offset"});
+}
+
+TEST_F(Following, IsRefusedInACircle)
+{
+    s->addMotionTracking("face");
+    a->addMotionTracking("face");
+    const auto face = [](const Clip* clip) { return Timeline::TrackingLinkInfo({clip, "face"}, QPointF()); };
+    refused(session.follow(b, face(b)), {"\"b\"", "follows it"});
+    done(session.follow(a, face(s)));
+    done(session.follow(s, face(b)));
+    refused(session.follow(b, face(a)), {"\"b\"", "\"a\"", "follows it"});
+    // Another module may have made one.
+    track(b, a);
+    done(session.follow(c, face(a)));
+}
+
 // Other timelines
 
 TEST_F(EditSessionStructure, AClipOfAnotherTimelineIsRefused)

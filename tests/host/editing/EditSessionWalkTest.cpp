@@ -87,6 +87,10 @@ private:
         add("moveTrack", 2, [this] { return session.moveTrack(track(), track()); });
         add("removeTrack", 1, [this] { return session.removeTrack(chance(4) ? track() : nullptr); });
         add("link", 8, [this] { return session.link(clip(), clip()); });
+        add("follow", 8, [this] {
+            return session.follow(clip(), Timeline::TrackingLinkInfo({clip(), "face"}, QPointF()));
+        });
+        add("unfollow", 4, [this] { return session.unfollow(clip()); });
         add("unlink", 3, [this] { return session.unlink(clip()); });
     }
 
@@ -136,6 +140,9 @@ private:
             return clip();
         }
         Clip* const made = session.makeClip(type);
+        if (chance(2)) {
+            made->addMotionTracking("face");
+        }
         return made->setSourceDuration(number(5, 6000))->setUnlimitedDuration(chance(8));
     }
 
@@ -308,7 +315,7 @@ TEST(EditSessionWalk, EveryMoveIsDoneAsAWholeOrRefusedAndLeavesTheTimelineSound)
         EXPECT_GE(count, 100) << name;
         EXPECT_GE(refused[name], 100) << name;
     }
-    EXPECT_EQ(done.size(), 20u);
+    EXPECT_EQ(done.size(), 22u);
     EXPECT_GE(mostTransitions, 4u);
 }
 
