@@ -29,6 +29,8 @@ QList<QStringList> commandsOf(const QStringList& words)
 const char* const editCommands =
     R"(Edits, of which several are separated by "then" and stored together:
   add FILE [TIME]                       at the end, or where later clips make room
+  overwrite FILE TIME [TRACK [LEVEL]]   what lies under it is trimmed, split or removed
+  title TEXT TIME [LENGTH [TRACK]]      above what lies there; TEXT may be a document with a preset
   move CLIP TIME [TRACK [LEVEL]]
   trim-left CLIP TIME [ripple]          the clip starts at the time
   trim-right CLIP TIME [ripple]         the clip ends at the time
@@ -41,6 +43,8 @@ const char* const editCommands =
   track add ROLE                        primary, extra-video, native-audio, audio, title or quiz
   track move TRACK TRACK, track remove TRACK
   link MASTER SLAVE, unlink SLAVE
+  follow CLIP CLIP TRACKING [X Y]       what a tracking has found in the other, at an offset from it
+  unfollow CLIP
   delete CLIP, extract CLIP             leaving a gap or closing it
 CLIP is a number or a name, TRACK and TRANSITION are numbers, as show prints them before the first edit; what
 an edit makes is numbered on from there. Times are times of the timeline: 1:02:03.5, 62.5 (seconds) or 62500ms.

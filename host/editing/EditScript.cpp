@@ -2,75 +2,16 @@
 #include "host/editing/EditScript.h"
 
 #include "host/commands/Refusal.h"
-#include "host/text/TimeText.h"
+#include "host/editing/EditWords.h"
 #include "host/timeline/TimelineOutline.h"
 
-#include <EditorModel/effects/Transition.h>
-
 #include <algorithm>
-#include <cmath>
 
 namespace Host {
 namespace {
 
 using Timeline::Clip;
-using Timeline::ClipTiming;
 using Timeline::Track;
-
-QString quoted(const QString& word)
-{
-    return '"' + word + '"';
-}
-
-/// Why a command cannot be understood; the command names it.
-[[noreturn]] void reject(const QString& why)
-{
-    throw Refusal(QString(), why);
-}
-
-MTime timeAt(const QString& word)
-{
-    const auto time = timeOfText(word);
-    if (!time) {
-        reject(quoted(word) + " is no time: 1:02.5, 62.5 and 62500ms are");
-    }
-    return *time;
-}
-
-double factorAt(const QString& word)
-{
-    bool isNumber = false;
-    const double factor = word.toDouble(&isNumber);
-    if (!isNumber || !std::isfinite(factor)) {
-        reject(quoted(word) + " is no speed: 2 and 0.5 are");
-    }
-    return factor;
-}
-
-/// The last word of a command may ask the later clips to follow.
-Ripple rippleAt(const QStringList& words, int index)
-{
-    if (words.size() <= index) {
-        return Ripple::No;
-    }
-    if (words[index] != "ripple") {
-        reject(quoted(words[index]) + " is not understood: \"ripple\" may stand there");
-    }
-    return Ripple::Yes;
-}
-
-TrackType roleAt(const QString& word)
-{
-    const QString role = QString(word).replace('-', ' ').toLower();
-    for (const TrackType type :
-         {PrimaryTrack, ExtraVideoTrack, NativeAudioTrack, AudioTrack, TitleTrack, QuizTrack}) {
-        if (role == QString::fromStdString(roleText(type))) {
-            return type;
-        }
-    }
-    reject(quoted(word) + " is no role of a track: primary, extra-video, native-audio, audio, title and quiz "
-                          "are");
-}
 
 /// By its number, from 1 on; null for what is no number of anything.
 template <class T>
@@ -122,6 +63,8 @@ const std::vector<EditScript::Command>& EditScript::commands()
 {
     static const std::vector<Command> all = {
         {"add", 2, 3, &EditScript::add},
+        {"overwrite", 3, 5, &EditScript::overwrite},
+        {"title", 3, 5, &EditScript::title},
         {"move", 3, 5, &EditScript::move},
         {"trim-left", 3, 4, &EditScript::trimLeft},
         {"trim-right", 3, 4, &EditScript::trimRight},
@@ -134,6 +77,8 @@ const std::vector<EditScript::Command>& EditScript::commands()
         {"extract", 2, 2, &EditScript::extract},
         {"link", 3, 3, &EditScript::link},
         {"unlink", 2, 2, &EditScript::unlink},
+        {"follow", 4, 6, &EditScript::follow},
+        {"unfollow", 2, 2, &EditScript::unfollow},
         {"transition add", 4, 6, &EditScript::addTransition},
         {"transition remove", 3, 3, &EditScript::removeTransition},
         {"track add", 3, 3, &EditScript::addTrack},
@@ -156,125 +101,6 @@ const EditScript::Command& EditScript::commandFor(const QStringList& words)
         reject(words.size() < found->leastWords ? "lacks a word" : "has a word too many");
     }
     return *found;
-}
-
-EditResult EditScript::add(const QStringList& words)
-{
-    if (words.size() == 2) {
-        return lay(m_session, m_media.make(words[1]));
-    }
-    const MTime at = timeAt(words[2]);
-    return lay(m_session, m_media.make(words[1]), &at);
-}
-
-EditResult EditScript::move(const QStringList& words)
-{
-    const Clip* const clip = clipAt(words[1]);
-    const MTime at = timeAt(words[2]);
-    if (words.size() == 3) {
-        return m_session.move(clip, at);
-    }
-    bool isLevel = true;
-    const int level = words.size() == 5 ? words[4].toInt(&isLevel) : 0;
-    if (!isLevel) {
-        reject(quoted(words[4]) + " is no level");
-    }
-    return m_session.move(clip, at, trackAt(words[3]), level);
-}
-
-EditResult EditScript::trimLeft(const QStringList& words)
-{
-    const Clip* const clip = clipAt(words[1]);
-    return m_session.trimLeft(clip, timeAt(words[2]) - timeline().clipTiming(clip).timestamp,
-                              rippleAt(words, 3));
-}
-
-EditResult EditScript::trimRight(const QStringList& words)
-{
-    const Clip* const clip = clipAt(words[1]);
-    return m_session.trimRight(clip, timeline().clipTiming(clip).end() - timeAt(words[2]),
-                               rippleAt(words, 3));
-}
-
-EditResult EditScript::split(const QStringList& words)
-{
-    return m_session.split(clipAt(words[1]), timeAt(words[2]));
-}
-
-EditResult EditScript::setSpeed(const QStringList& words)
-{
-    return m_session.setSpeed(clipAt(words[1]), factorAt(words[2]), rippleAt(words, 3));
-}
-
-EditResult EditScript::reverse(const QStringList& words)
-{
-    return m_session.reverse(clipAt(words[1]));
-}
-
-EditResult EditScript::fadeIn(const QStringList& words)
-{
-    const Clip* const clip = clipAt(words[1]);
-    return m_session.setFades(clip, timeAt(words[2]), timeline().clipTiming(clip).fadeOutDuration);
-}
-
-EditResult EditScript::fadeOut(const QStringList& words)
-{
-    const Clip* const clip = clipAt(words[1]);
-    return m_session.setFades(clip, timeline().clipTiming(clip).fadeInDuration, timeAt(words[2]));
-}
-
-EditResult EditScript::lift(const QStringList& words)
-{
-    return m_session.lift(clipAt(words[1]));
-}
-
-EditResult EditScript::extract(const QStringList& words)
-{
-    return m_session.extract(clipAt(words[1]));
-}
-
-EditResult EditScript::link(const QStringList& words)
-{
-    return m_session.link(clipAt(words[1]), clipAt(words[2]));
-}
-
-EditResult EditScript::unlink(const QStringList& words)
-{
-    return m_session.unlink(clipAt(words[1]));
-}
-
-EditResult EditScript::addTransition(const QStringList& words)
-{
-    const auto clipOrNone = [this](const QString& word) { return word == "-" ? nullptr : clipAt(word); };
-    const Timeline::ClipPair pair(clipOrNone(words[2]), clipOrNone(words[3]));
-    const MTime wish = words.size() > 4 ? timeAt(words[4]) : MTime(-1);
-    if (words.size() > 4 && !(wish > MTime())) {
-        reject(quoted(words[4]) + " is no length of a transition");
-    }
-    const QString name = words.size() > 5 ? words[5] : "dissolve";
-    Transition::Object* const transition = m_session.makeTransition(name);
-    transition->tag = name;
-    return m_session.addTransition(transition, pair, wish);
-}
-
-EditResult EditScript::removeTransition(const QStringList& words)
-{
-    return m_session.removeTransition(transitionAt(words[2]));
-}
-
-EditResult EditScript::addTrack(const QStringList& words)
-{
-    return m_session.addTrack(m_session.makeTrack(roleAt(words[2])));
-}
-
-EditResult EditScript::moveTrack(const QStringList& words)
-{
-    return m_session.moveTrack(trackAt(words[2]), trackAt(words[3]));
-}
-
-EditResult EditScript::removeTrack(const QStringList& words)
-{
-    return m_session.removeTrack(trackAt(words[2]));
 }
 
 const Clip* EditScript::clipAt(const QString& word) const

@@ -37,6 +37,8 @@ private:
     static const Command& commandFor(const QStringList& words);
 
     EditResult add(const QStringList& words);
+    EditResult overwrite(const QStringList& words);
+    EditResult title(const QStringList& words);
     EditResult move(const QStringList& words);
     EditResult trimLeft(const QStringList& words);
     EditResult trimRight(const QStringList& words);
@@ -49,6 +51,8 @@ private:
     EditResult extract(const QStringList& words);
     EditResult link(const QStringList& words);
     EditResult unlink(const QStringList& words);
+    EditResult follow(const QStringList& words);
+    EditResult unfollow(const QStringList& words);
     EditResult addTransition(const QStringList& words);
     EditResult removeTransition(const QStringList& words);
     EditResult addTrack(const QStringList& words);

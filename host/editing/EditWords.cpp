@@ -1,0 +1,85 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "host/editing/EditWords.h"
+
+#include "host/commands/Refusal.h"
+#include "host/text/TimeText.h"
+#include "host/timeline/TimelineOutline.h"
+
+#include <cmath>
+
+namespace Host {
+
+QString quoted(const QString& word)
+{
+    return '"' + word + '"';
+}
+
+void reject(const QString& why)
+{
+    throw Refusal(QString(), why);
+}
+
+MTime timeAt(const QString& word)
+{
+    const auto time = timeOfText(word);
+    if (!time) {
+        reject(quoted(word) + " is no time: 1:02.5, 62.5 and 62500ms are");
+    }
+    return *time;
+}
+
+double factorAt(const QString& word)
+{
+    bool isNumber = false;
+    const double factor = word.toDouble(&isNumber);
+    if (!isNumber || !std::isfinite(factor)) {
+        reject(quoted(word) + " is no speed: 2 and 0.5 are");
+    }
+    return factor;
+}
+
+Ripple rippleAt(const QStringList& words, int index)
+{
+    if (words.size() <= index) {
+        return Ripple::No;
+    }
+    if (words[index] != "ripple") {
+        reject(quoted(words[index]) + " is not understood: \"ripple\" may stand there");
+    }
+    return Ripple::Yes;
+}
+
+TrackType roleAt(const QString& word)
+{
+    const QString role = QString(word).replace('-', ' ').toLower();
+    for (const TrackType type :
+         {PrimaryTrack, ExtraVideoTrack, NativeAudioTrack, AudioTrack, TitleTrack, QuizTrack}) {
+        if (role == QString::fromStdString(roleText(type))) {
+            return type;
+        }
+    }
+    reject(quoted(word) + " is no role of a track: primary, extra-video, native-audio, audio, title and quiz "
+                          "are");
+}
+
+double numberAt(const QString& word)
+{
+    bool isNumber = false;
+    const double number = word.toDouble(&isNumber);
+    if (!isNumber || !std::isfinite(number)) {
+        reject(quoted(word) + " is no number");
+    }
+    return number;
+}
+
+int levelAt(const QString& word)
+{
+    bool isLevel = false;
+    const int level = word.toInt(&isLevel);
+    if (!isLevel) {
+        reject(quoted(word) + " is no level");
+    }
+    return level;
+}
+
+} // namespace Host

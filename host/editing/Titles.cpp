@@ -1,0 +1,80 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "host/editing/Titles.h"
+
+#include "host/commands/Refusal.h"
+#include "host/editing/TimelineInvariants.h"
+#include "host/project/DocumentFile.h"
+
+#include <QFileInfo>
+
+#include <set>
+
+namespace Host {
+namespace {
+
+using Timeline::Clip;
+using Timeline::ClipTiming;
+using Timeline::Track;
+
+/// On a track without levels this may be one that it does not have.
+int freeLevel(const Timeline::Object& timeline, const ClipTiming& wanted)
+{
+    std::set<int> taken;
+    for (const auto& [clip, timing] : timeline.clips) {
+        if (timing.track == wanted.track && timing.overlapsWith(wanted)) {
+            taken.insert(timing.trackLevel);
+        }
+    }
+    int level = 0;
+    while (taken.count(level) != 0) {
+        ++level;
+    }
+    return level;
+}
+
+MTime lengthOf(const Overlay::Preset& preset, MTime wish)
+{
+    if (wish != MTime(-1)) {
+        return wish;
+    }
+    return preset.sourceDuration > MTime() ? preset.sourceDuration : Clip::DEFAULT_TITLE_CLIP_DURATION;
+}
+
+} // namespace
+
+Title titleOf(const QString& textOrPath)
+{
+    if (!Document::formOfPath(textOrPath)) {
+        Overlay::Preset preset;
+        preset.appendItem(Overlay::Item().setText(textOrPath));
+        return {textOrPath, preset};
+    }
+    const Document::Graph graph = loadDocument(textOrPath);
+    const auto* const preset = graph.rootAs<Overlay::Preset>();
+    if (!preset) {
+        throw Refusal(textOrPath, "holds no title, but " + contentOf(graph));
+    }
+    return {preset->tag.isEmpty() ? QFileInfo(textOrPath).completeBaseName() : preset->tag, *preset};
+}
+
+EditResult layTitle(EditSession& session, const Title& title, const TitlePlace& place)
+{
+    const Track* track = place.track ? place.track : session.timeline()->titleTrack();
+    if (!track) {
+        track = session.makeTrack(TitleTrack);
+        EditResult added = session.addTrack(track);
+        if (!added) {
+            return added;
+        }
+    }
+    const MTime length = lengthOf(title.preset, place.length);
+    Clip* const clip = session.makeClip(Clip::OverlayClip);
+    clip->setName(title.name)->setOverlay(session.makeOverlay(title.preset));
+    clip->setSourceDuration(length)->setUnlimitedDuration(true);
+    const bool isInRange = place.at >= MTime() && place.at <= LATEST_TIME && length <= LATEST_TIME;
+    const int level =
+        isInRange ? freeLevel(*session.timeline(), ClipTiming(track, 0, place.at, length, 0, length)) : 0;
+    return session.overwrite({clip, track, level}, place.at);
+}
+
+} // namespace Host

@@ -1,0 +1,36 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "host/editing/EditSession.h"
+
+#include <EditorModel/effects/Overlay.h>
+
+#include <QString>
+
+namespace Host {
+
+/// What a title is to show, by the name that its clip gets.
+struct Title
+{
+    QString name;
+    Overlay::Preset preset;
+};
+
+/// A preset of a single text; where the text is the name of a document, by its ending, the preset in that.
+/// Throws Refusal where the document is missing or holds no preset, and Document::Error.
+Title titleOf(const QString& textOrPath);
+
+struct TitlePlace
+{
+    MTime at;
+    /// -1 is the preset's own length, or that of titles by default.
+    MTime length = -1;
+    /// Null is the first title track, which is made if it is missing.
+    const Timeline::Track* track = nullptr;
+};
+
+/// Lays a clip with a copy of the preset on the lowest level that is free there. It may be trimmed to any
+/// length.
+EditResult layTitle(EditSession& session, const Title& title, const TitlePlace& place);
+
+} // namespace Host

@@ -1,0 +1,155 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "Edits.h"
+#include "tests/host/shared/Samples.h"
+
+#include "host/commands/Refusal.h"
+#include "host/editing/EditScript.h"
+#include "host/media/MediaOpener.h"
+
+#include <EditorModel/effects/Overlay.h>
+#include <EditorModel/persistence/Document.h>
+
+#include <gmock/gmock.h>
+
+namespace {
+
+using namespace EditTests;
+using testing::IsEmpty;
+using testing::StartsWith;
+
+/// A picture of 10 s with a tracking, and a second one behind it.
+class EditScript : public testing::Test
+{
+protected:
+    EditScript()
+    {
+        a->setName("a")->setSourceDuration(10000)->addMotionTracking("face");
+        b->setName("b")->setSourceDuration(10000);
+        EXPECT_TRUE(session.addTrack(primary));
+        EXPECT_TRUE(session.append({a, primary}));
+        EXPECT_TRUE(session.append({b, primary}));
+        script = std::make_unique<Host::EditScript>(session);
+    }
+
+    void run(const QStringList& words) { EXPECT_EQ(refusalOf(words), "") << words.join(' ').toStdString(); }
+    std::string refusalOf(const QStringList& words)
+    {
+        try {
+            script->run(words);
+        } catch (const Host::Refusal& refusal) {
+            EXPECT_EQ(refusal.name, words.join(' '));
+            return refusal.reason.toStdString();
+        }
+        return {};
+    }
+    const Timeline::Object& now() const { return *session.timeline(); }
+    std::string titles() const { return row(now(), now().titleTrack()); }
+    const Overlay::Preset* presetAt(MTime time) const
+    {
+        const auto found = now().clipsAt(now().titleTrack(), time);
+        return found.size() == 1 ? (*found.begin())->overlay : nullptr;
+    }
+
+    const Host::MediaOpener opener;
+    const HostTests::Folder folder;
+    EditSession session;
+    Track* primary = session.makeTrack(PrimaryTrack);
+    Clip* a = session.makeClip(Clip::VideoClip);
+    Clip* b = session.makeClip(Clip::VideoClip);
+    std::unique_ptr<Host::EditScript> script;
+};
+
+TEST_F(EditScript, LaysATitleOfATextForSixSeconds)
+{
+    run({"title", "Hello, world", "1.5"});
+    EXPECT_EQ(titles(), "Hello, world 1500-7500 @0");
+    const Overlay::Preset* const preset = presetAt(2000);
+    ASSERT_TRUE(preset);
+    ASSERT_EQ(preset->items.size(), 1u);
+    EXPECT_EQ(preset->items.front().text, "Hello, world");
+}
+
+TEST_F(EditScript, LaysTitlesAboveOneAnother)
+{
+    run({"title", "one", "1", "4"});
+    run({"title", "two", "3", "2"});
+    run({"title", "three", "5", "20"});
+    EXPECT_EQ(titles(), "one 1000-5000 @0, three 5000-25000 @0, two 3000-5000 @0 L1");
+    // Only tracks with levels have room above.
+    EXPECT_THAT(refusalOf({"title", "four", "1", "4", "1"}), testing::HasSubstr("level 1"));
+    run({"track", "add", "extra-video"});
+    run({"title", "four", "1", "4", "3"});
+    EXPECT_EQ(row(now(), now().extraVideoTrack()), "four 1000-5000 @0");
+}
+
+TEST_F(EditScript, LaysAPresetOfADocument)
+{
+    Overlay::Preset preset;
+    preset.setTag("Ribbon")->setSourceDuration(2500)->setScriptId("ribbon");
+    preset.appendItem(Overlay::Item().setText("left"))->appendItem(Overlay::Item().setText("right"));
+    for (const auto& [name, form] : {std::pair("a.json", Document::Json), std::pair("a.xml", Document::Xml),
+                                     std::pair("a.bin", Document::Binary)}) {
+        const QString path = folder.path(name);
+        Document::saveFile(path, {&preset}, form, Document::Stream);
+        run({"title", path, "1"});
+        ASSERT_EQ(titles(), "Ribbon 1000-3500 @0") << name;
+        const Overlay::Preset* const laid = presetAt(2000);
+        EXPECT_TRUE(*laid == preset) << name;
+        EXPECT_EQ(laid->tag, "Ribbon");
+        EXPECT_TRUE(session.lift(*now().clipsAt(now().titleTrack()).begin()));
+    }
+    preset.setTag("")->setSourceDuration(0);
+    Document::saveFile(folder.path("plain.json"), {&preset}, Document::Json, Document::Stream);
+    run({"title", folder.path("plain.json"), "0"});
+    EXPECT_EQ(titles(), "plain 0-6000 @0");
+}
+
+TEST_F(EditScript, RefusesTitlesThatItCannotLay)
+{
+    EXPECT_EQ(refusalOf({"title", "text", "soon"}), "\"soon\" is no time: 1:02.5, 62.5 and 62500ms are");
+    EXPECT_EQ(refusalOf({"title", "text", "1", "0"}), "\"0\" is no length of a title");
+    EXPECT_EQ(refusalOf({"title", "text", "1", "2", "7"}), "there is no track \"7\"");
+    EXPECT_EQ(refusalOf({"title", "text"}), "lacks a word");
+    EXPECT_THAT(refusalOf({"title", "no/such.json", "1"}), StartsWith("no/such.json does not exist"));
+    const Media::File file;
+    const QString path = folder.path("file.json");
+    Document::saveFile(path, {&file}, Document::Json, Document::Stream);
+    EXPECT_EQ(refusalOf({"title", path, "1"}), path.toStdString() + " holds no title, but File");
+    EXPECT_FALSE(now().titleTrack());
+}
+
+TEST_F(EditScript, LetsClipsFollowWhatIsTracked)
+{
+    run({"title", "tag", "1", "2"});
+    run({"follow", "tag", "a", "face", "0.5", "-0.25"});
+    const Clip* const tag = *now().clipsAt(now().titleTrack()).begin();
+    ASSERT_TRUE(now().getTrackingLink(tag));
+    EXPECT_EQ(now().getTrackingLink(tag)->trackedObject, Timeline::TrackedObject(a, "face"));
+    EXPECT_EQ(now().getTrackingLink(tag)->objectRelativeOffset, QPointF(0.5, -0.25));
+    run({"follow", "3", "1", "face"});
+    EXPECT_EQ(now().getTrackingLink(tag)->objectRelativeOffset, QPointF());
+    EXPECT_THAT(refusalOf({"follow", "3", "2", "face"}), testing::HasSubstr("no such tracking"));
+    EXPECT_EQ(refusalOf({"follow", "3", "1", "face", "1"}), "lacks a word");
+    EXPECT_EQ(refusalOf({"follow", "3", "1", "face", "1", "up"}), "\"up\" is no number");
+    run({"unfollow", "tag"});
+    EXPECT_THAT(now().trackingLinks, IsEmpty());
+    EXPECT_THAT(refusalOf({"unfollow", "tag"}), testing::HasSubstr("follows no other clip"));
+}
+
+TEST_F(EditScript, OverwritesWithAFile)
+{
+    // Of 2 s, with its sound.
+    run({"overwrite", HostTests::sample("film.mp4"), "9"});
+    EXPECT_EQ(row(now(), primary), "a 0-9000 @0, film.mp4 9000-11000 @0, b 11000-20000 @1000");
+    EXPECT_EQ(row(now(), now().nativeAudioTrack()), "film.mp4 9000-11000 @0");
+    run({"track", "add", "extra-video"});
+    run({"overwrite", HostTests::sample("picture.png"), "0", "3", "1"});
+    EXPECT_EQ(row(now(), now().extraVideoTrack()), "picture.png 0-4000 @0 L1");
+    // Without a track for it there is nothing that it could overwrite.
+    run({"overwrite", HostTests::sample("speech.wav"), "1"});
+    EXPECT_EQ(row(now(), now().detachedAudioTrack()), "speech.wav 1000-2500 @0");
+    EXPECT_EQ(refusalOf({"overwrite", HostTests::sample("picture.png"), "0", "3", "high"}),
+              "\"high\" is no level");
+}
+
+} // namespace
