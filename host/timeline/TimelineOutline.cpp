@@ -137,6 +137,7 @@ TimelineOutline::TimelineOutline(const Timeline::Object& timeline) : m_timeline(
     listTransitions();
     m_slaves = inOrder(timeline.links);
     m_followers = inOrder(timeline.trackingLinks);
+    listLabels();
 }
 
 /// The clips that are keys of a map, those that are not on the timeline last.
@@ -226,6 +227,22 @@ void TimelineOutline::listTransitions()
     };
     std::sort(m_transitions.begin(), m_transitions.end(),
               [&key](const auto* a, const auto* b) { return key(a) < key(b); });
+}
+
+void TimelineOutline::listLabels()
+{
+    for (const Clip* clip : m_clips) {
+        for (const Timeline::Label* label : clip->labels) {
+            if (label) {
+                m_labels.push_back({clip, label});
+            }
+        }
+    }
+    const auto key = [this](const ClipLabel& entry) {
+        return std::tuple(numberOf(entry.clip), entry.label->position, entry.label->name);
+    };
+    std::sort(m_labels.begin(), m_labels.end(),
+              [&key](const ClipLabel& a, const ClipLabel& b) { return key(a) < key(b); });
 }
 
 } // namespace Host

@@ -47,6 +47,13 @@ SourceStretch sourceStretchOf(const Timeline::Clip& clip, const Timeline::ClipTi
 /// Timeline::Object::duration(), but without overflow where times from a file are any.
 MTime lengthOf(const Timeline::Object& timeline);
 
+/// A label of a clip.
+struct ClipLabel
+{
+    const Timeline::Clip* clip;
+    const Timeline::Label* label;
+};
+
 /// The contents of a timeline in an order that does not depend on addresses, by which people can name them:
 /// tracks as the timeline lists them, clips by track, level and start, transitions by their clips. Numbers
 /// count from 1. Null pointers are left out. The timeline must outlive it, and its containers stay as they
@@ -67,6 +74,8 @@ public:
     /// The clips that have a link, or a tracking link, in the order of the clips.
     const std::vector<const Timeline::Clip*>& slaves() const { return m_slaves; }
     const std::vector<const Timeline::Clip*>& followers() const { return m_followers; }
+    /// By clip, position and name.
+    const std::vector<ClipLabel>& labels() const { return m_labels; }
 
     /// 0 for what is not here.
     int numberOf(const Timeline::Clip* clip) const;
@@ -76,6 +85,7 @@ private:
     void listTracks();
     void listClips();
     void listTransitions();
+    void listLabels();
     template <class Value>
     std::vector<const Timeline::Clip*> inOrder(const std::map<const Timeline::Clip*, Value>& map) const;
 
@@ -87,6 +97,7 @@ private:
     std::vector<const Transition::Object*> m_transitions;
     std::vector<const Timeline::Clip*> m_slaves;
     std::vector<const Timeline::Clip*> m_followers;
+    std::vector<ClipLabel> m_labels;
 };
 
 } // namespace Host

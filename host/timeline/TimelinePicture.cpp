@@ -3,6 +3,7 @@
 
 #include "host/media/MediaText.h"
 #include "host/timeline/TimelineClipBox.h"
+#include "host/timeline/TimelineLabels.h"
 #include "host/timeline/TimelineLanes.h"
 #include "host/timeline/TimelineRuler.h"
 #include "host/timeline/TimelineStyle.h"
@@ -45,6 +46,7 @@ void TimelinePicture::draw(QPainter& painter) const
     }
     const TimelineTies ties(m_layout, m_outline);
     ties.drawTransitions(painter);
+    drawLabels(painter, m_layout, m_outline);
     ties.drawLinks(painter);
     ties.drawTrackingLinks(painter);
     if (m_outline.clips().empty()) {

@@ -22,6 +22,8 @@ inline const QColor transition(251, 191, 36);
 inline const QColor transitionEdge(180, 83, 9);
 inline const QColor link(71, 85, 105);
 inline const QColor trackingLink(147, 51, 234);
+inline const QColor label(13, 148, 136);
+inline const QColor labelText(19, 78, 74);
 inline const QColor broken(220, 38, 38);
 
 } // namespace Host::Style

@@ -189,6 +189,17 @@ std::string trackingTable(const TimelineOutline& outline)
     return outline.followers().empty() ? std::string() : "\n" + lines(table);
 }
 
+std::string labelTable(const TimelineOutline& outline)
+{
+    Table table({Table::Left, Table::Left, Table::Right});
+    table.addRow({"Label", "Clip", "Position"});
+    for (const auto& [clip, label] : outline.labels()) {
+        table.addRow({label->name.isEmpty() ? "-" : elided(label->name, widestName), clipText(outline, clip),
+                      lengthText(label->position)});
+    }
+    return outline.labels().empty() ? std::string() : "\n" + lines(table);
+}
+
 } // namespace
 
 std::string formatText(const Timeline::Object& timeline)
@@ -206,7 +217,7 @@ std::string timelineTable(const Timeline::Object& timeline)
                        counted(outline.listedTracks(), "track", "tracks"), lengthText(lengthOf(timeline)),
                        formatText(timeline)) +
            trackTable(outline) + clipTable(outline) + transitionTable(outline) + linkTable(outline) +
-           trackingTable(outline);
+           trackingTable(outline) + labelTable(outline);
 }
 
 } // namespace Host

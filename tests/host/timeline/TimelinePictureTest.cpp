@@ -4,6 +4,7 @@
 
 #include "host/commands/Refusal.h"
 #include "host/timeline/TimelineClipBox.h"
+#include "host/timeline/TimelineLabels.h"
 #include "host/timeline/TimelinePicture.h"
 #include "host/timeline/TimelineRuler.h"
 #include "host/timeline/TimelineStyle.h"
@@ -203,6 +204,38 @@ TEST(TimelinePicture, TiesSlavesToTheirMastersAndFollowersToWhatTheyFollow)
     EXPECT_EQ(colouredBy(Host::Style::trackingLink), 0);
     sample.timeline.addTrackingLink(slave, {Timeline::TrackedObject(master, "face"), QPointF()});
     EXPECT_GT(colouredBy(Host::Style::trackingLink), 8);
+}
+
+TEST(TimelinePicture, FliesFlagsAtTheLabelsOfClips)
+{
+    SampleTimeline sample;
+    const Timeline::Track* const primary = sample.addTrack(PrimaryTrack);
+    Clip* const clip = sample.addClip("a", Clip::VideoClip, primary, 0, 10000);
+    Timeline::Label chorus, nameless, far;
+    chorus.setName("chorus")->setPosition(2000);
+    nameless.setPosition(7000);
+    far.setName("far")->setPosition(std::numeric_limits<qint64>::max());
+    clip->addLabel(&chorus)->addLabel(&nameless)->addLabel(&far);
+    const TimelinePicture picture(sample.timeline, "labels");
+    const Drawing drawing(picture);
+    const auto flag = [&](const Timeline::Label& label) {
+        return Host::labelFlag(picture.layout(), {clip, &label});
+    };
+    EXPECT_TRUE(flag(far).isEmpty());
+    const QRectF body = Host::clipBody(picture.layout().boxOf(clip));
+    EXPECT_NEAR(flag(chorus).left(), body.left() + 0.2 * body.width(), 0.01);
+    EXPECT_NEAR(flag(nameless).left(), body.left() + 0.7 * body.width(), 0.01);
+    for (const Timeline::Label* label : {&chorus, &nameless}) {
+        const QRectF staff = flag(*label);
+        EXPECT_TRUE(isNear(drawing.at({staff.left(), staff.center().y()}), Host::Style::label));
+    }
+    // The cloth of one without a name is filled, the other has its name on it.
+    EXPECT_TRUE(isNear(drawing.at(flag(nameless).bottomRight() - QPointF(3.0, 5.0)), Host::Style::label));
+    const Folder folder;
+    Host::savePicture(picture, folder.path("t.svg"), Host::Svg);
+    const Svg svg = readSvg(folder.path("t.svg"));
+    EXPECT_EQ(svg.texts.count("chorus"), 1);
+    EXPECT_EQ(svg.texts.count("far"), 0);
 }
 
 TEST(TimelinePicture, GreysWhatIsNotPlayed)

@@ -70,6 +70,27 @@ Following clip  Tracked in  Tracking
 )");
 }
 
+TEST(TimelineTable, ListsTheLabelsOfClips)
+{
+    SampleTimeline sample;
+    const Timeline::Track* const primary = sample.addTrack(PrimaryTrack);
+    Clip* const second = sample.addClip("b.mp4", Clip::VideoClip, primary, 4000, 2000);
+    Clip* const first = sample.addClip("a.mp4", Clip::VideoClip, primary, 0, 4000);
+    Timeline::Label cut, beat, nameless;
+    cut.setName("cut here")->setPosition(2500);
+    beat.setName("beat")->setPosition(1000);
+    nameless.setPosition(4500);
+    first->addLabel(&cut)->addLabel(&beat)->addLabel(nullptr);
+    second->addLabel(&nameless)->addLabel(&cut);
+    EXPECT_THAT(Host::timelineTable(sample.timeline), testing::EndsWith(R"(
+Label     Clip         Position
+beat      1 a.mp4  00:00:01.000
+cut here  1 a.mp4  00:00:02.500
+cut here  2 b.mp4  00:00:02.500
+-         2 b.mp4  00:00:04.500
+)"));
+}
+
 TEST(TimelineTable, GivesTheSourceInItsOwnTime)
 {
     SampleTimeline sample;
