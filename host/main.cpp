@@ -3,6 +3,7 @@
 #include "host/commands/CurveCommand.h"
 #include "host/commands/EditCommand.h"
 #include "host/commands/NewCommand.h"
+#include "host/commands/PackagesCommand.h"
 #include "host/commands/PictureCommand.h"
 #include "host/commands/ProbeCommand.h"
 #include "host/commands/ShowCommand.h"
@@ -146,6 +147,11 @@ Host::ExitCode runEdit(const Arguments& arguments)
     return Host::editProject(fileName(arguments.document), fileNames(arguments.words));
 }
 
+Host::ExitCode runPackages(const Arguments& arguments)
+{
+    return Host::showPackages(fileNames(arguments.files));
+}
+
 using Runner = Host::ExitCode (*)(const Arguments& arguments);
 
 CLI::App* addCommand(CLI::App& app, Arguments& arguments, const char* name, const char* description,
@@ -256,6 +262,17 @@ void addPicture(CLI::App& app, Arguments& arguments)
         ->check(checkOutputName);
 }
 
+void addPackages(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const packages = addCommand(
+        app, arguments, "packages", "Show what packages bring, and what is wrong with them", runPackages);
+    packages->add_option("FOLDER", arguments.files, "Packages, or folders of packages")
+        ->required()
+        ->type_name("");
+    // They hold pictures.
+    packages->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
+}
+
 void showGraveMessages(QtMsgType type, const QMessageLogContext&, const QString& message)
 {
     if (type == QtCriticalMsg || type == QtFatalMsg) {
@@ -295,6 +312,7 @@ int main(int argc, char** argv)
     addNew(app, arguments);
     addEdit(app, arguments);
     addPicture(app, arguments);
+    addPackages(app, arguments);
     try {
         app.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
