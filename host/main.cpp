@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "host/commands/CheckCommand.h"
 #include "host/commands/Console.h"
+#include "host/commands/ConvertCommand.h"
 #include "host/commands/CurveCommand.h"
 #include "host/commands/EditCommand.h"
 #include "host/commands/NewCommand.h"
@@ -8,6 +10,7 @@
 #include "host/commands/ProbeCommand.h"
 #include "host/commands/ShowCommand.h"
 #include "host/media/MediaProbe.h"
+#include "host/project/FaultList.h"
 #include "host/text/DisplayText.h"
 
 #include <EditorModel/persistence/Document.h>
@@ -96,8 +99,11 @@ struct Arguments
     std::vector<std::string> files;
     std::vector<std::string> words;
     std::string document;
+    std::string output;
     bool json = false;
     bool verbose = false;
+    bool isForced = false;
+    bool isOwn = false;
 
     std::string picture;
     Host::CurveOptions curve;
@@ -145,6 +151,22 @@ Host::ExitCode runEdit(const Arguments& arguments)
 {
     Host::showMediaLibraryLog(false);
     return Host::editProject(fileName(arguments.document), fileNames(arguments.words));
+}
+
+Host::ExitCode runCheck(const Arguments& arguments)
+{
+    Host::showMediaLibraryLog(false);
+    return Host::checkProject(fileName(arguments.document), arguments.json);
+}
+
+Host::ExitCode runConvert(const Arguments& arguments)
+{
+    Host::ConvertOptions options;
+    options.input = fileName(arguments.document);
+    options.output = fileName(arguments.output);
+    options.isForced = arguments.isForced;
+    options.isOwn = arguments.isOwn;
+    return Host::convert(options);
 }
 
 Host::ExitCode runPackages(const Arguments& arguments)
@@ -262,6 +284,36 @@ void addPicture(CLI::App& app, Arguments& arguments)
         ->check(checkOutputName);
 }
 
+void addCheck(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const check =
+        addCommand(app, arguments, "check", "Tell what is wrong with a project", runCheck);
+    check->add_option("PROJECT", arguments.document, "A project, or a document with a timeline")
+        ->required()
+        ->type_name("");
+    check->add_flag("--json", arguments.json, "Print JSON instead of lines");
+    check->footer(
+        "The command ends with 0 if all is well, 1 if there are faults, 2 if the file can't be read.\n" +
+        Host::faultCodesText());
+    check->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
+}
+
+void addConvert(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const convert =
+        addCommand(app, arguments, "convert", "Write a document in another form", runConvert);
+    convert->add_option("IN", arguments.document, "A project or a document")->required()->type_name("");
+    convert->add_option("OUT", arguments.output, "Where it goes: .json, .xml or .bin")
+        ->required()
+        ->type_name("")
+        ->check(checkOutputName)
+        ->check(checkDocumentName);
+    convert->add_flag("--force", arguments.isForced, "Replace a file that is there");
+    convert->add_flag("--own", arguments.isOwn,
+                      "Read binary and XML archives too, which must be of your own making");
+    convert->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
+}
+
 void addPackages(CLI::App& app, Arguments& arguments)
 {
     CLI::App* const packages = addCommand(
@@ -312,6 +364,8 @@ int main(int argc, char** argv)
     addNew(app, arguments);
     addEdit(app, arguments);
     addPicture(app, arguments);
+    addCheck(app, arguments);
+    addConvert(app, arguments);
     addPackages(app, arguments);
     try {
         app.parse(argc, argv);
