@@ -12,6 +12,17 @@ namespace Host {
 using Timeline::Clip;
 using Timeline::Track;
 
+namespace {
+
+/// Sound that stands alone takes the audio track that is not linked to the picture.
+const Track* trackFor(const Timeline::Object& timeline, TrackType type)
+{
+    const Track* const detached = type == AudioTrack ? timeline.detachedAudioTrack() : nullptr;
+    return detached ? detached : timeline.findFirstTrack(type);
+}
+
+} // namespace
+
 EditResult EditScript::add(const QStringList& words)
 {
     if (words.size() == 2) {
@@ -24,13 +35,14 @@ EditResult EditScript::add(const QStringList& words)
 EditResult EditScript::overwrite(const QStringList& words)
 {
     const MTime at = timeAt(words[2]);
-    const Track* const track = words.size() > 3 ? trackAt(words[3]) : nullptr;
+    const Track* const wished = words.size() > 3 ? trackAt(words[3]) : nullptr;
     const int level = words.size() > 4 ? levelAt(words[4]) : 0;
     const MediaClips::Clips clips = m_media.make(words[1]);
-    if (!track && !timeline().findFirstTrack(clips.track)) {
+    const Track* const track = wished ? wished : trackFor(timeline(), clips.track);
+    if (!track) {
         return lay(m_session, clips, &at);
     }
-    Placement placement(clips.clip, track ? track : timeline().findFirstTrack(clips.track), level);
+    Placement placement(clips.clip, track, level);
     placement.nativeAudio = clips.nativeAudio;
     if (clips.nativeAudio && !timeline().nativeAudioTrack()) {
         EditResult added = m_session.addTrack(m_session.makeTrack(NativeAudioTrack));

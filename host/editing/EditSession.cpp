@@ -10,6 +10,7 @@
 #include <EditorModel/effects/Transition.h>
 
 #include <algorithm>
+#include <map>
 #include <utility>
 #include <vector>
 
@@ -82,15 +83,15 @@ bool cutOut(EditDraft& draft, const Clip* clip, MTime from, MTime to)
 
 void clearLane(EditDraft& draft, const ClipTiming& room)
 {
-    std::vector<const Clip*> under;
+    // By their starts, which are all different on a lane.
+    std::map<MTime, const Clip*> under;
     for (const auto& [clip, timing] : draft.timeline().clips) {
         if (laneOf(room).holds(timing) && timing.overlapsWith(room)) {
-            under.push_back(clip);
+            under.emplace(timing.timestamp, clip);
         }
     }
-    std::sort(under.begin(), under.end(), ClipOrder(&draft.timeline()));
     EditDraft::Clips covered;
-    for (const Clip* const clip : under) {
+    for (const auto& [start, clip] : under) {
         checkEditable(draft.timeline(), clip);
         if (!cutOut(draft, clip, room.timestamp, room.end())) {
             covered.insert(clip);

@@ -148,6 +148,11 @@ TEST_F(EditScript, OverwritesWithAFile)
     // Without a track for it there is nothing that it could overwrite.
     run({"overwrite", HostTests::sample("speech.wav"), "1"});
     EXPECT_EQ(row(now(), now().detachedAudioTrack()), "speech.wav 1000-2500 @0");
+    Track* const linked = session.makeTrack(AudioTrack);
+    EXPECT_TRUE(session.addTrack(linked->setLinked(true)));
+    EXPECT_TRUE(session.moveTrack(linked, now().detachedAudioTrack()));
+    run({"overwrite", HostTests::sample("speech.wav"), "2"});
+    EXPECT_EQ(row(now(), now().detachedAudioTrack()), "speech.wav 1000-2000 @0, speech.wav 2000-3500 @0");
     EXPECT_EQ(refusalOf({"overwrite", HostTests::sample("picture.png"), "0", "3", "high"}),
               "\"high\" is no level");
 }
