@@ -14,6 +14,8 @@ namespace {
 
 constexpr double clothHeight = 15.0;
 constexpr double clothWidth = 7.0;
+/// So that the edge of the box stays whole.
+constexpr double clothMargin = 1.0;
 constexpr double textMargin = 4.0;
 
 void drawFlag(QPainter& painter, const QRectF& flag, const QString& name, double room)
@@ -23,8 +25,8 @@ void drawFlag(QPainter& painter, const QRectF& flag, const QString& name, double
     // A dot or two tell nothing.
     const bool hasText = text == name || text.size() > 3;
     const double textWidth = hasText ? metrics.horizontalAdvance(text) + 2.0 * textMargin : 0.0;
-    const QRectF cloth(flag.left(), flag.bottom() - clothHeight, std::max(clothWidth, textWidth),
-                       clothHeight);
+    const QRectF cloth(flag.left(), flag.bottom() - clothHeight - clothMargin,
+                       std::max(clothWidth, textWidth), clothHeight);
     QColor ground = Style::paper;
     ground.setAlpha(215);
     painter.setPen(Qt::NoPen);
