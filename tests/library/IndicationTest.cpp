@@ -79,6 +79,22 @@ TEST(Indication, TakingTheMarkFromWhatIsNoFavouriteDoesNothing)
     EXPECT_EQ(Testing::Dump::of(marks), Testing::Dump::of(everyFieldSet()));
 }
 
+TEST(Indication, AFavouriteIsNewOrKnownLikeAnyOtherItem)
+{
+    Object marks;
+    marks.setFavorite("a", true).setNew("a", true).setId("Title");
+    EXPECT_THAT(marks.favoriteItems, ElementsAre("a"));
+    EXPECT_THAT(marks.newItems, ElementsAre("a"));
+    marks.setFavorite("a", true);
+    EXPECT_THAT(marks.newItems, ElementsAre("a"));
+    marks.setNew("a", false);
+    EXPECT_THAT(marks.favoriteItems, ElementsAre("a"));
+    EXPECT_THAT(marks.knownItems, ElementsAre("a"));
+    marks.setFavorite("a", false);
+    EXPECT_THAT(marks.favoriteItems, IsEmpty());
+    EXPECT_THAT(marks.knownItems, ElementsAre("a"));
+}
+
 TEST(Indication, WhatCeasesToBeNewBecomesKnown)
 {
     Object marks = everyFieldSet();

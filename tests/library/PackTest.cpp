@@ -131,7 +131,9 @@ TEST(Pack, DiffersByEachField)
     expectDifferent([](Pack& other) { other.locale2productName["de_DE"] = "Klima"; });
     expectDifferent([](Pack& other) { other.locale2productName.remove("de_DE"); });
     expectDifferent([](Pack& other) { other.locale2previewUrl["it_IT"] = "http://a.test/it.png"; });
+    expectDifferent([](Pack& other) { other.locale2previewUrl["fr_FR"] = "http://a.test/other.png"; });
     expectDifferent([](Pack& other) { other.downloadUrl.clear(); });
+    expectDifferent([](Pack& other) { other.downloadUrl = "http://a.test/other.zip"; });
     expectDifferent([](Pack& other) { other.reservedText = "more"; });
     expectDifferent([](Pack& other) { other.setInstallationStatus(Pack::DefaultStatus); });
     expectDifferent([](Pack& other) { other.setInstallationStatus(Pack::InstallationStatus(2)); });
