@@ -136,11 +136,13 @@ TEST(MotionTrackingHelper, HearsOnlyTheAnswersToItsQuestion)
 
 TEST(MotionTrackingHelper, TheLastAnswerCounts)
 {
-    Holder holder({"a"});
-    holder.beforeAnswering = [](const IsAvailableTrackingRequest& request) {
-        PubSub::publish(IsAvailableTrackingNotification(request.sender, false));
-    };
-    EXPECT_TRUE(Helper().isAvailable("a"));
+    for (const bool last : {true, false}) {
+        Holder holder(last ? std::set<QString>{"a"} : std::set<QString>{});
+        holder.beforeAnswering = [&](const IsAvailableTrackingRequest& request) {
+            PubSub::publish(IsAvailableTrackingNotification(request.sender, !last));
+        };
+        EXPECT_EQ(Helper().isAvailable("a"), last);
+    }
 }
 
 TEST(MotionTrackingHelper, AnswersAQuestionWithinAQuestion)
