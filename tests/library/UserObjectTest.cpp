@@ -18,6 +18,8 @@ using ::testing::IsEmpty;
 static_assert(Testing::isVirtualBase<Serialize::ISerializable, UserObject>);
 static_assert(Testing::isVirtualBase<PubSub::Object, UserObject>);
 static_assert(std::is_same_v<decltype(std::declval<UserObject>().addItem(nullptr)), PubSub::Object*>);
+static_assert(Testing::isVirtualBase<PubSub::Object, EditorCollection::Object>);
+static_assert(std::is_same_v<decltype(EditorCollection::globalObject()), const EditorCollection::Object*>);
 
 class UserCollection : public ::testing::Test
 {
@@ -112,6 +114,14 @@ TEST_F(UserCollection, AListReplacesTheOldOne)
     collection.setItems(list);
     EXPECT_THAT(collection.items, ElementsAre(&c, &b, &c));
     EXPECT_THAT(list, ElementsAre(&c, &b, &c));
+}
+
+TEST_F(UserCollection, AListThatIsGivenAwayIsTakenOver)
+{
+    std::deque<const Import::Object*> taken = {&c, &b};
+    const auto* const first = &taken.front();
+    collection.setItems(std::move(taken));
+    EXPECT_EQ(&collection.items.front(), first);
 }
 
 TEST_F(UserCollection, EqualsOneWithTheSameItemsInTheSameOrder)

@@ -119,6 +119,15 @@ TEST(Film, SettersStore)
     expectFull(fullFilm());
 }
 
+TEST(Film, TakesAListOfTransitionsOver)
+{
+    std::deque<const Transition::Object*> taken = {&transitions[1], &transitions[0]};
+    const auto* const first = &taken.front();
+    Film::Object film;
+    film.setTransitionsList(std::move(taken));
+    EXPECT_EQ(&film.transitionsList.front(), first);
+}
+
 TEST(Film, CopiesWhole)
 {
     Film::Object film = fullFilm();
@@ -295,6 +304,9 @@ TEST(FilmDocument, IsWrittenInAnOrderOfItsOwn)
                 ElementsAre("timelineBindings", "clipBindings", "expectedDuration", "nativeAudioVolume",
                             "detachedAudioVolume", "fitDurationToAudio", "cropMode", "transitionsList"));
     EXPECT_THAT(Testing::defaultFields(fullFilm()), IsEmpty());
+    const auto fields = Testing::fieldTexts(fullFilm());
+    EXPECT_EQ(fields[3], Testing::FieldText("nativeAudioVolume", "-3"));
+    EXPECT_EQ(fields[4], Testing::FieldText("detachedAudioVolume", "80"));
 }
 
 TEST(FilmDocument, KeepsTheTreesAndTheSettings)
