@@ -3,6 +3,8 @@
 
 #include <EditorModel/persistence/Fields.h>
 
+#include <utility>
+
 namespace Indication {
 
 Object::~Object() = default;
