@@ -1,10 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/effects/Views.h>
+#include <EditorModel/library/ImportViews.h>
 
 #include <gmock/gmock.h>
 
-#include <map>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace {
@@ -70,7 +71,7 @@ protected:
     T object;
 };
 
-using Previewed = testing::Types<Effect::Object, Transition::Object, Overlay::Preset>;
+using Previewed = testing::Types<Effect::Object, Transition::Object, Overlay::Preset, Import::Object>;
 
 struct PreviewedNames
 {
@@ -204,6 +205,23 @@ TEST(PreviewChange, CommitsWhatTheSettersStored)
     EXPECT_EQ(preset.items.size(), 1u);
     EXPECT_THAT(lines, testing::Contains("effects changed Soft - Soft"));
     EXPECT_THAT(lines, testing::Contains("presets changed Titles - Titles"));
+}
+
+TEST(PreviewChange, CommitsTheAddressesOfAnImportAsAWhole)
+{
+    Lines lines;
+    Import::Object object;
+    Player<Import::Object> owner(lines, "owner");
+    owner.previewOwn(&object);
+    {
+        auto chain = owner.previewChange(&object);
+        chain->setLocation("/media/rain.mov");
+        chain->setRemoteSize(7);
+        EXPECT_EQ(object.location(), QString());
+        EXPECT_EQ(object.remoteSize(), -1);
+    }
+    EXPECT_EQ(object.location(), "/media/rain.mov");
+    EXPECT_EQ(object.remoteSize(), 7);
 }
 
 } // namespace
