@@ -131,7 +131,7 @@ void ImportFetch::copyBlock()
     m_copied += block.size();
     m_copiedOfFile += block.size();
     const qint64 size = m_files[m_next].size;
-    if (m_copiedOfFile > size || (block.isEmpty() && m_copiedOfFile < size)) {
+    if (m_source.size() != size || (block.isEmpty() && m_copiedOfFile < size)) {
         throw ImportError(WrongSize, m_source.fileName() + ": has changed while it was fetched");
     }
     if (m_copiedOfFile == size) {
