@@ -65,6 +65,7 @@ public:
     const Import::Object* object;
 };
 
+/// Tells whoever has asked which state is that of the item. It stays with whoever owns the states.
 class EDITORMODEL_EXPORT AcquireStateNotification : public ::Message::Types::Notification<AcquireSubscription>
 {
 public:
