@@ -1,12 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "tests/media/AddingRequests.h"
 #include "tests/shared/FieldTexts.h"
-
-#include <EditorModel/media/FileAdder.h>
-
-#include <EditorModel/media/ResourceTable.h>
-#include <EditorModel/timeline/Timeline.h>
-
-#include <gmock/gmock.h>
 
 #include <functional>
 #include <stdexcept>
@@ -19,71 +13,16 @@
 namespace {
 
 using namespace FileAdder;
+using namespace FileAdderTests;
 using testing::ElementsAre;
 using testing::IsEmpty;
-using Timeline::Clip;
-using Timeline::ClipBuildingStrategy;
 
 static_assert(Testing::isVirtualBase<PubSub::Object, FileAdder::Object>);
-static_assert(std::is_base_of_v<Message::Types::Request<FileAdder::Object>, AddMediaFiles>);
-static_assert(std::is_base_of_v<Message::Types::Notification<FileAdder::Object>, AddMediaFilesResult>);
 static_assert(std::is_base_of_v<PubSub::Subscriber<AddMediaFilesResult>, Helper>);
 static_assert(std::is_same_v<decltype(FileAdder::globalObject()), const FileAdder::Object*>);
-static_assert(sizeof(Asrc) == 4 && sizeof(AddedResult) == 4);
-static_assert(!std::is_default_constructible_v<TimelineContext>);
-static_assert(!std::is_default_constructible_v<ResourceTableContext>);
-static_assert(std::is_default_constructible_v<Contexts>);
-static_assert(std::is_empty_v<UserCollectionContext>);
-
-template <class T>
-constexpr bool isCopied = std::is_copy_constructible_v<T>&& std::is_copy_assignable_v<T>;
-static_assert(isCopied<TimelineContext> && isCopied<UserCollectionContext> && isCopied<ResourceTableContext>);
-static_assert(isCopied<Contexts> && isCopied<AddMediaFiles> && isCopied<AddMediaFilesResult>);
-static_assert(isCopied<Helper> && isCopied<FileAdder::Object>);
-
-const Timeline::Object someTimeline;
-const Timeline::Object otherTimeline;
-const Timeline::Track someTrack;
-const ResourceTable::Object someTable;
-const ResourceTable::Object otherTable;
-
-const QStringList twoFiles = {QStringLiteral("/films/b.mp4"), QStringLiteral("/films/a.mp4")};
-
-AddedResult result(int value)
-{
-    return static_cast<AddedResult>(value);
-}
-
-Asrc source(int value)
-{
-    return static_cast<Asrc>(value);
-}
-
-void expectContext(const TimelineContext& context, const Timeline::Object* timeline,
-                   const Timeline::Track* track, MTime position, int clipType, int trackLevel, bool flag,
-                   int strategy)
-{
-    EXPECT_EQ(context.timeline, timeline);
-    EXPECT_EQ(context.track, track);
-    EXPECT_EQ(context.position, position);
-    EXPECT_EQ(context.clipType, clipType);
-    EXPECT_EQ(context.trackLevel, trackLevel);
-    EXPECT_EQ(context.flag, flag);
-    EXPECT_EQ(context.clipBuildingStrategy, strategy);
-}
-
-/// Every field differs from what the other constructors give.
-TimelineContext fullContext()
-{
-    TimelineContext context(&someTimeline, &someTrack, MTime(250), Clip::AudioClip, 3, true);
-    context.clipBuildingStrategy = ClipBuildingStrategy(4);
-    return context;
-}
-
-void expectFullContext(const TimelineContext& context)
-{
-    expectContext(context, &someTimeline, &someTrack, 250, 2, 3, true, 4);
-}
+static_assert(std::is_copy_constructible_v<FileAdder::Object> &&
+              std::is_copy_assignable_v<FileAdder::Object>);
+static_assert(std::is_copy_constructible_v<Helper> && std::is_copy_assignable_v<Helper>);
 
 /// Adds files for others: writes down what it is asked, and gives one answer after the other.
 class Module : public PubSub::Subscriber<AddMediaFiles>
@@ -118,165 +57,6 @@ TEST(FileAdderSender, IsOneForTheWholeProcess)
     ASSERT_NE(here, nullptr);
     EXPECT_EQ(there, here);
     EXPECT_EQ(globalObject(), here);
-}
-
-TEST(FileAdderTimelineContext, NamesATimelineAlone)
-{
-    expectContext(TimelineContext(&someTimeline), &someTimeline, nullptr, -1, 0, -1, false, 0);
-    expectContext(TimelineContext(nullptr), nullptr, nullptr, -1, 0, -1, false, 0);
-}
-
-TEST(FileAdderTimelineContext, NamesALevelAndATimeOnATrack)
-{
-    expectContext(TimelineContext(&someTimeline, &someTrack, 2, MTime(1500)), &someTimeline, &someTrack, 1500,
-                  0, 2, false, 0);
-}
-
-TEST(FileAdderTimelineContext, NamesWhatIsToLieOnATrack)
-{
-    expectContext(TimelineContext(&someTimeline, &someTrack, MTime(1500), Clip::OverlayClip, 2, true),
-                  &someTimeline, &someTrack, 1500, 4, 2, true, 0);
-    expectContext(TimelineContext(&someTimeline, nullptr, MTime(0), Clip::VideoClip, 0, false), &someTimeline,
-                  nullptr, 0, 1, 0, false, 0);
-}
-
-TEST(FileAdderTimelineContext, NamesAStrategy)
-{
-    expectContext(TimelineContext(&someTimeline, ClipBuildingStrategy(7)), &someTimeline, nullptr, -1, 0, -1,
-                  false, 7);
-}
-
-TEST(FileAdderTimelineContext, CopiesWhole)
-{
-    const TimelineContext full = fullContext();
-    expectFullContext(TimelineContext(full));
-    TimelineContext assigned(&otherTimeline);
-    EXPECT_EQ(&(assigned = full), &assigned);
-    expectFullContext(assigned);
-    const TimelineContext& itself = assigned;
-    assigned = itself;
-    expectFullContext(assigned);
-}
-
-TEST(FileAdderResourceTableContext, NamesATable)
-{
-    const ResourceTableContext context(&someTable);
-    EXPECT_EQ(context.table, &someTable);
-    ResourceTableContext assigned(nullptr);
-    EXPECT_EQ(assigned.table, nullptr);
-    assigned = context;
-    EXPECT_EQ(assigned.table, &someTable);
-    EXPECT_EQ(ResourceTableContext(context).table, &someTable);
-}
-
-TEST(FileAdderContexts, AreAbsentAtFirst)
-{
-    const Contexts contexts;
-    EXPECT_FALSE(contexts.timeline);
-    EXPECT_FALSE(contexts.userCollection);
-    EXPECT_FALSE(contexts.resourceTable);
-}
-
-TEST(FileAdderContexts, AreSetOneByOne)
-{
-    Contexts timeline;
-    EXPECT_EQ(&timeline.setContext(fullContext()), &timeline);
-    ASSERT_TRUE(timeline.timeline);
-    expectFullContext(*timeline.timeline);
-    EXPECT_FALSE(timeline.userCollection);
-    EXPECT_FALSE(timeline.resourceTable);
-
-    Contexts collection;
-    EXPECT_EQ(&collection.setContext(UserCollectionContext()), &collection);
-    EXPECT_FALSE(collection.timeline);
-    EXPECT_TRUE(collection.userCollection);
-    EXPECT_FALSE(collection.resourceTable);
-
-    Contexts table;
-    EXPECT_EQ(&table.setContext(ResourceTableContext(&someTable)), &table);
-    EXPECT_FALSE(table.timeline);
-    EXPECT_FALSE(table.userCollection);
-    ASSERT_TRUE(table.resourceTable);
-    EXPECT_EQ(table.resourceTable->table, &someTable);
-}
-
-TEST(FileAdderContexts, KeepTheLastOfAKind)
-{
-    Contexts contexts;
-    contexts.setContext(fullContext()).setContext(TimelineContext(&otherTimeline));
-    expectContext(*contexts.timeline, &otherTimeline, nullptr, -1, 0, -1, false, 0);
-    contexts.setContext(ResourceTableContext(&someTable)).setContext(ResourceTableContext(&otherTable));
-    EXPECT_EQ(contexts.resourceTable->table, &otherTable);
-    contexts.setContext(UserCollectionContext()).setContext(UserCollectionContext());
-    EXPECT_TRUE(contexts.userCollection);
-}
-
-Contexts allContexts()
-{
-    return Contexts()
-        .setContext(fullContext())
-        .setContext(UserCollectionContext())
-        .setContext(ResourceTableContext(&someTable));
-}
-
-void expectAllContexts(const Contexts& contexts)
-{
-    ASSERT_TRUE(contexts.timeline);
-    expectFullContext(*contexts.timeline);
-    EXPECT_TRUE(contexts.userCollection);
-    ASSERT_TRUE(contexts.resourceTable);
-    EXPECT_EQ(contexts.resourceTable->table, &someTable);
-}
-
-TEST(FileAdderContexts, CopyWhole)
-{
-    const Contexts all = allContexts();
-    expectAllContexts(all);
-    expectAllContexts(Contexts(all));
-    Contexts assigned;
-    EXPECT_EQ(&(assigned = all), &assigned);
-    const Contexts& itself = assigned;
-    assigned = itself;
-    expectAllContexts(assigned);
-    assigned = Contexts();
-    EXPECT_FALSE(assigned.timeline || assigned.userCollection || assigned.resourceTable);
-}
-
-void expectRequest(const AddMediaFiles& request)
-{
-    EXPECT_EQ(request.sender, globalObject());
-    EXPECT_EQ(request.files, twoFiles);
-    EXPECT_EQ(request.source, 5);
-    expectAllContexts(request.contexts);
-}
-
-TEST(FileAdderMessages, HoldWhatTheyAreMadeWith)
-{
-    const AddMediaFiles request(twoFiles, source(5), allContexts());
-    expectRequest(request);
-    expectRequest(AddMediaFiles(request));
-    AddMediaFiles assigned({}, source(0), {});
-    EXPECT_EQ(&(assigned = request), &assigned);
-    const AddMediaFiles& itself = assigned;
-    assigned = itself;
-    expectRequest(assigned);
-
-    const AddMediaFilesResult answer(result(6), twoFiles);
-    AddMediaFilesResult other(result(0), {});
-    EXPECT_EQ(&(other = answer), &other);
-    for (const AddMediaFilesResult& each : {answer, other}) {
-        EXPECT_EQ(each.sender, globalObject());
-        EXPECT_EQ(each.result, 6);
-        EXPECT_EQ(each.files, twoFiles);
-    }
-}
-
-TEST(FileAdderMessages, TakeTheirContextsByValue)
-{
-    Contexts contexts = allContexts();
-    const AddMediaFiles request(twoFiles, source(5), contexts);
-    contexts = Contexts();
-    expectRequest(request);
 }
 
 TEST(FileAdder, AsksForWhatItIsGiven)
