@@ -10,6 +10,7 @@
 
 #include <QBuffer>
 #include <QFile>
+#include <QFileInfo>
 
 #include <algorithm>
 #include <utility>
@@ -162,8 +163,9 @@ std::string ProjectStore::backupHint(const QString& path)
 
 bool ProjectStore::isProject(const QString& path)
 {
+    // Opening anything else may block.
     QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
+    if (!QFileInfo(path).isFile() || !file.open(QIODevice::ReadOnly)) {
         return false;
     }
     const QByteArray begin = file.read(projectMarkLength);

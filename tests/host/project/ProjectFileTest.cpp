@@ -112,7 +112,7 @@ protected:
         m_folder.write(QFileInfo(path()).fileName(), content);
     }
 
-    const Folder m_folder;
+    const Folder m_folder{};
 };
 INSTANTIATE_TEST_SUITE_P(Forms, ProjectFiles, testing::Values("json", "xml", "bin"),
                          [](const auto& form) { return std::string(form.param); });
@@ -126,6 +126,7 @@ TEST_P(ProjectFiles, AreKnownByTheirMarks)
     EXPECT_FALSE(Host::ProjectStore::isProject(path()));
     EXPECT_FALSE(Host::ProjectStore::isProject(m_folder.path("missing")));
     EXPECT_FALSE(Host::ProjectStore::isProject(m_folder.path()));
+    EXPECT_FALSE(Host::ProjectStore::isProject("/dev/zero"));
 }
 
 /// Why the file is refused; what is taken is none.

@@ -61,7 +61,7 @@ protected:
         return stat(path.toUtf8().constData(), &status) == 0 ? status.st_ino : 0;
     }
 
-    const Folder m_folder;
+    const Folder m_folder{};
     const QString m_path = m_folder.path(QString("film.") + GetParam());
     LongProject m_project;
 };

@@ -53,7 +53,7 @@ protected:
         }
     }
 
-    const Folder m_folder;
+    const Folder m_folder{};
 };
 INSTANTIATE_TEST_SUITE_P(Forms, ProjectJourney, testing::Values("json", "xml", "bin"),
                          [](const auto& form) { return std::string(form.param); });

@@ -73,7 +73,7 @@ protected:
     }
     std::string message(const std::string& reason) const { return m_path.toStdString() + ": " + reason; }
 
-    const Folder m_folder;
+    const Folder m_folder{};
     const QString m_path = m_folder.path("film.json");
 };
 
@@ -194,14 +194,10 @@ TEST_F(ProjectSaving, LeavesTheOldFileIfAnyStepFails)
     EXPECT_EQ(refusalAfter([] { refuseCalls({SYS_fchmod}, EPERM); }),
               message("cannot be written: Operation not permitted"));
     expectUntouched();
-    EXPECT_EQ(refusalAfter([] {
-                  refuseCalls({SYS_rename, SYS_renameat, SYS_renameat2}, EIO);
-              }),
+    EXPECT_EQ(refusalAfter([] { refuseCalls(renamingCalls, EIO); }),
               message("cannot be kept as a backup: Input/output error"));
     expectUntouched();
-    EXPECT_EQ(refusalAfter([] {
-                  refuseCalls({SYS_open, SYS_openat}, EMFILE);
-              }),
+    EXPECT_EQ(refusalAfter([] { refuseCalls(openingCalls, EMFILE); }),
               message("cannot be written: Too many open files"));
     expectUntouched();
 }
@@ -209,7 +205,7 @@ TEST_F(ProjectSaving, LeavesTheOldFileIfAnyStepFails)
 TEST_F(ProjectSaving, CopiesTheBackupWhereAFileHasOneNameOnly)
 {
     ASSERT_EQ(chmod(m_path.toUtf8().constData(), 0640), 0);
-    EXPECT_EQ(refusalAfter([] { refuseCalls({SYS_link, SYS_linkat}, EPERM); }), "none");
+    EXPECT_EQ(refusalAfter([] { refuseCalls(linkingCalls, EPERM); }), "none");
     EXPECT_EQ(names(), "film.json film.json.backup");
     EXPECT_EQ(numberIn(m_path), 3);
     EXPECT_EQ(numberInBackup(m_path), 2);
@@ -266,7 +262,7 @@ TEST_F(ProjectSaving, TellsWhereNothingCanBeSaved)
 TEST_F(ProjectSaving, LeavesTheOldFileIfTheProjectCannotBeStored)
 {
     SmallProject project(3);
-    // A clip by value is not behind any pointer, so that the class of this one decides.
+    // It has no name to be stored under.
     class Unknown : public Timeline::Object
     {};
     Unknown unknown;

@@ -49,6 +49,26 @@ inline std::string inChild(const std::function<std::string()>& body)
     return answer;
 }
 
+/// Not every processor has the older ones of the calls that do the same.
+const std::vector<unsigned> openingCalls = {
+#ifdef SYS_open
+    SYS_open,
+#endif
+    SYS_openat};
+const std::vector<unsigned> linkingCalls = {
+#ifdef SYS_link
+    SYS_link,
+#endif
+    SYS_linkat};
+const std::vector<unsigned> renamingCalls = {
+#ifdef SYS_rename
+    SYS_rename,
+#endif
+#ifdef SYS_renameat
+    SYS_renameat,
+#endif
+    SYS_renameat2};
+
 /// From now on these system calls of the process end in this error. There is no way back.
 inline void refuseCalls(const std::vector<unsigned>& calls, unsigned error)
 {
