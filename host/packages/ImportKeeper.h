@@ -18,9 +18,9 @@ namespace Host {
 /// The module that owns the states of imports and fetches their media from this machine's files, one after
 /// another, into a folder.
 ///
-/// Every item has a state as soon as anybody asks for it, for as long as anybody who asked has not released
-/// it, it is waited for or fetched, and its owner has not removed it from the bus. The item itself must live
-/// as long. An item with a location is Fetched from the start.
+/// An item has a state from the moment in which anybody asks for it, until all who asked have released it and
+/// it is neither waited for nor fetched, or until its owner removes it from the bus. The item must live as
+/// long. One with a location is Fetched from the start.
 ///
 /// Others change the stage alone, and only so: NotFetched or FetchFailed to Waiting, which asks for the item,
 /// and Waiting, Fetching or Installing to NotFetched, which gives it up; other changes are refused. Nothing
