@@ -1,0 +1,240 @@
+// SPDX-License-Identifier: Apache-2.0
+// What documents with packages, marks and items of collections look like, written down by hand. Stored data
+// is for life: these texts are never written anew from what the code gives.
+#include <EditorModel/library/Indication.h>
+#include <EditorModel/library/PackageContent.h>
+#include <EditorModel/library/PackageStorage.h>
+#include <EditorModel/library/PersistentItem.h>
+
+#include <boost/archive/xml_iarchive.hpp>
+#include <boost/archive/xml_oarchive.hpp>
+#include <boost/serialization/nvp.hpp>
+
+#include <gtest/gtest.h>
+
+#include <sstream>
+#include <string>
+
+namespace {
+
+const std::string begin = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
+<!DOCTYPE boost_serialization>
+<boost_serialization signature="serialization::archive" version="18">
+<content class_id="0" tracking_level="1" version="0" object_id="_0">
+)";
+
+const std::string end = R"(</content>
+</boost_serialization>
+
+)";
+
+const std::string package = begin + R"(	<overlays class_id="1" tracking_level="0" version="0">
+		<count>1</count>
+		<item_version>0</item_version>
+		<item class_id="2" tracking_level="1" version="0" object_id="_1">
+			<contentPath>titles</contentPath>
+			<translationDir>titles/lang</translationDir>
+			<category2collection class_id="3" tracking_level="0" version="0">
+				<count>1</count>
+				<item_version>0</item_version>
+				<item class_id="4" tracking_level="0" version="0">
+					<first>Rain</first>
+					<second>Title</second>
+				</item>
+			</category2collection>
+			<resources class_id="5" tracking_level="0" version="0">
+				<count>1</count>
+				<item_version>0</item_version>
+				<item class_id="6" tracking_level="1" version="0" object_id="_2">
+					<type>3</type>
+					<id>rain</id>
+					<file>rain.mov</file>
+					<intro>100</intro>
+					<outro>250</outro>
+					<count>2</count>
+				</item>
+			</resources>
+		</item>
+	</overlays>
+	<transitions>
+		<count>0</count>
+		<item_version>0</item_version>
+	</transitions>
+	<effects>
+		<count>0</count>
+		<item_version>0</item_version>
+	</effects>
+	<imports>
+		<count>0</count>
+		<item_version>0</item_version>
+	</imports>
+	<fontsDir>fonts</fontsDir>
+	<quizzes>
+		<count>0</count>
+		<item_version>0</item_version>
+	</quizzes>
+)" + end;
+
+const std::string storage = begin + R"(	<package2storage class_id="1" tracking_level="0" version="0">
+		<count>1</count>
+		<item_version>0</item_version>
+		<item class_id="2" tracking_level="0" version="0">
+			<first>weather</first>
+			<second class_id="3" tracking_level="1" version="0" object_id="_1">
+				<collection2tags class_id="4" tracking_level="0" version="0">
+					<count>1</count>
+					<item_version>0</item_version>
+					<item class_id="5" tracking_level="0" version="0">
+						<first>Title</first>
+						<second class_id="6" tracking_level="0" version="0">
+							<count>2</count>
+							<item_version>0</item_version>
+							<item>Rain</item>
+							<item>Sun</item>
+						</second>
+					</item>
+				</collection2tags>
+				<collection2categories>
+					<count>1</count>
+					<item_version>0</item_version>
+					<item>
+						<first>Title</first>
+						<second>
+							<count>1</count>
+							<item_version>0</item_version>
+							<item>Weather</item>
+						</second>
+					</item>
+				</collection2categories>
+			</second>
+		</item>
+	</package2storage>
+)" + end;
+
+const std::string marks = begin + R"(	<id>Effects</id>
+	<favoriteItems class_id="1" tracking_level="0" version="0">
+		<count>1</count>
+		<item_version>0</item_version>
+		<item>blur</item>
+	</favoriteItems>
+	<newItems>
+		<count>2</count>
+		<item_version>0</item_version>
+		<item>glow</item>
+		<item>haze</item>
+	</newItems>
+	<knownItems>
+		<count>0</count>
+		<item_version>0</item_version>
+	</knownItems>
+)" + end;
+
+// The element and the picture are null, so that no other class's fields stand in the document.
+const std::string item = begin + R"(	<uniqueId>{1}</uniqueId>
+	<item class_id="-1"></item>
+	<preview class_id="2" tracking_level="0" version="1">
+		<px class_id="-1"></px>
+	</preview>
+	<categories class_id="4" tracking_level="0" version="0">
+		<count>1</count>
+		<item_version>0</item_version>
+		<item>all</item>
+	</categories>
+	<collectionId>Transitions</collectionId>
+	<customStrings class_id="5" tracking_level="0" version="0">
+		<count>1</count>
+		<item_version>0</item_version>
+		<item class_id="6" tracking_level="0" version="0">
+			<first>author</first>
+			<second>me</second>
+		</item>
+	</customStrings>
+)" + end;
+
+template <class T>
+std::string saved(const T& content)
+{
+    std::ostringstream stream;
+    {
+        boost::archive::xml_oarchive archive(stream);
+        archive << BOOST_SERIALIZATION_NVP(content);
+    }
+    return stream.str();
+}
+
+template <class T>
+T loaded(const std::string& document)
+{
+    T content;
+    std::istringstream stored(document);
+    boost::archive::xml_iarchive archive(stored);
+    archive >> BOOST_SERIALIZATION_NVP(content);
+    return content;
+}
+
+TEST(PackageDocuments, TheXmlArchiveIsAsWrittenDown)
+{
+    Package::Resource resource;
+    resource.type = Package::Resource::Type(3);
+    resource.id = "rain";
+    resource.file = "rain.mov";
+    resource.timing.intro = 100;
+    resource.timing.outro = 250;
+    resource.timing.loopMinCount = 2;
+    Package::CollectionAddOn addOn;
+    addOn.contentPath = "titles";
+    addOn.translationDir = "titles/lang";
+    addOn.category2collection = {{"Rain", "Title"}};
+    addOn.resources = {resource};
+    Package::Object written;
+    written.overlays = {addOn};
+    written.fontsDir = "fonts";
+    EXPECT_EQ(saved(written), package);
+
+    const auto read = loaded<Package::Object>(package);
+    EXPECT_EQ(saved(read), package);
+    ASSERT_EQ(read.overlays.size(), 1u);
+    ASSERT_EQ(read.overlays[0].resources.size(), 1u);
+    EXPECT_EQ(read.overlays[0].resources[0].file, "rain.mov");
+    EXPECT_EQ(read.overlays[0].resources[0].timing.loopMinCount, 2);
+}
+
+TEST(PackageStorageDocuments, TheXmlArchiveIsAsWrittenDown)
+{
+    Package::Storage written;
+    Package::StorageItem& stored = written.package2storage["weather"];
+    stored.collection2tags = {{"Title", {"Rain", "Sun"}}};
+    stored.collection2categories = {{"Title", {"Weather"}}};
+    EXPECT_EQ(saved(written), storage);
+    EXPECT_EQ(saved(loaded<Package::Storage>(storage)), storage);
+}
+
+TEST(IndicationDocuments, TheXmlArchiveIsAsWrittenDown)
+{
+    Indication::Object written;
+    written.setId("Effects").setFavorite("blur", true).setNew("glow", true).setNew("haze", true);
+    EXPECT_EQ(saved(written), marks);
+
+    const auto read = loaded<Indication::Object>(marks);
+    EXPECT_EQ(saved(read), marks);
+    EXPECT_TRUE(read.isFavorite("blur"));
+    EXPECT_TRUE(read.isNew("haze"));
+}
+
+TEST(ItemDocuments, TheXmlArchiveIsAsWrittenDown)
+{
+    using Item = EditorCollection::PersistentItem<Transition::Object>;
+    Item written;
+    written.uniqueId = "{1}";
+    written.categories = {"all"};
+    written.collectionId = "Transitions";
+    written.customStrings = {{"author", "me"}};
+    EXPECT_EQ(saved(written), item);
+
+    const auto read = loaded<Item>(item);
+    EXPECT_EQ(saved(read), item);
+    EXPECT_EQ(read.collectionId, "Transitions");
+    EXPECT_EQ(read.preview, nullptr);
+}
+
+} // namespace
