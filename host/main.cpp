@@ -150,7 +150,8 @@ Host::ExitCode runNew(const Arguments& arguments)
 Host::ExitCode runEdit(const Arguments& arguments)
 {
     Host::showMediaLibraryLog(false);
-    return Host::editProject(fileName(arguments.document), fileNames(arguments.words));
+    return Host::editProject(fileName(arguments.document), fileNames(arguments.words),
+                             fileNames(arguments.files));
 }
 
 Host::ExitCode runCheck(const Arguments& arguments)
@@ -264,6 +265,12 @@ void addEdit(CLI::App& app, Arguments& arguments)
 {
     CLI::App* const edit = addCommand(app, arguments, "edit", "Edit the timeline of a project", runEdit);
     edit->add_option("PROJECT", arguments.document, "A document with a timeline")->required()->type_name("");
+    // One folder an option: what follows it are edits.
+    edit->add_option("--packages", arguments.files, "A package, or a folder of packages, to take titles from")
+        ->type_name("FOLDER")
+        ->expected(1)
+        ->allow_extra_args(false)
+        ->take_all();
     edit->add_option("EDIT", arguments.words, "One of the edits below; others follow after \"then\"")
         ->required()
         ->type_name("");

@@ -3,8 +3,9 @@
 
 #include "host/commands/Refusal.h"
 #include "host/editing/EditScript.h"
-#include "host/media/MediaOpener.h"
+#include "host/packages/PackageShelf.h"
 #include "host/project/ProjectDocument.h"
+#include "host/project/ProjectModules.h"
 
 namespace Host {
 namespace {
@@ -24,13 +25,34 @@ QList<QStringList> commandsOf(const QStringList& words)
     return commands;
 }
 
+void fill(PackageShelf& shelf, const QStringList& folders)
+{
+    for (const QString& folder : folders) {
+        shelf.put(folder);
+    }
+    const std::deque<PackageFault> faults = shelf.faults();
+    if (!faults.empty()) {
+        const PackageFault& first = faults.front();
+        throw Refusal(first.file.isEmpty() ? first.package : first.package + ": " + first.file, first.reason);
+    }
+}
+
+/// A plain document is a project that has but a timeline.
+Project::Content contentOf(const ProjectDocument& document)
+{
+    Project::Content content = document.project() ? *document.project() : Project::Content();
+    content.timeline = &document.timeline();
+    return content;
+}
+
 } // namespace
 
 const char* const editCommands =
     R"(Edits, of which several are separated by "then" and stored together:
   add FILE [TIME]                       at the end, or where later clips make room
   overwrite FILE TIME [TRACK [LEVEL]]   what lies under it is trimmed, split or removed
-  title TEXT TIME [LENGTH [TRACK]]      above what lies there; TEXT may be a document with a preset
+  title TEXT TIME [LENGTH [TRACK]]      above what lies there; TEXT may be a document with a preset, or the
+                                        identifier of one in a package, and =TEXT behind it
   move CLIP TIME [TRACK [LEVEL]]
   trim-left CLIP TIME [ripple]          the clip starts at the time
   trim-right CLIP TIME [ripple]         the clip ends at the time
@@ -38,7 +60,7 @@ const char* const editCommands =
   speed CLIP FACTOR [ripple]            1 plays the source as it is
   reverse CLIP
   fade-in CLIP LENGTH, fade-out CLIP LENGTH
-  transition add CLIP CLIP [LENGTH [NAME]]   - for either makes it one-sided
+  transition add CLIP CLIP [LENGTH [NAME]]   - for either makes it one-sided; NAME may be in a package
   transition remove TRANSITION
   track add ROLE                        primary, extra-video, native-audio, audio, title or quiz
   track move TRACK TRACK, track remove TRACK
@@ -51,13 +73,14 @@ an edit makes is numbered on from there. Times are times of the timeline: 1:02:0
 With ripple the clips behind follow.
 )";
 
-ExitCode editProject(const QString& path, const QStringList& words)
+ExitCode editProject(const QString& path, const QStringList& words, const QStringList& packages)
 {
     return unlessRefused([&] {
+        PackageShelf shelf;
+        fill(shelf, packages);
         const ProjectDocument document = ProjectDocument::load(path);
-        const MediaOpener opener;
-        EditSession session(&document.timeline());
-        EditScript script(session);
+        ProjectModules modules(contentOf(document));
+        EditScript script(modules.session(), modules.places(), &shelf);
         for (const QStringList& command : commandsOf(words)) {
             script.run(command);
         }

@@ -40,7 +40,8 @@ void append(std::vector<const T*>& numbered, const std::vector<const T*>& presen
 
 } // namespace
 
-EditScript::EditScript(EditSession& session) : m_session(session), m_media(session)
+EditScript::EditScript(EditSession& session, const FileAdder::Contexts& places, const PackageShelf* shelf)
+    : m_session(session), m_places(places), m_shelf(shelf), m_media(session)
 {
     numberTheNew();
 }

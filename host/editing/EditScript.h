@@ -4,6 +4,8 @@
 #include "host/editing/EditSession.h"
 #include "host/media/MediaClips.h"
 
+#include <EditorModel/media/FileAdder.h>
+
 #include <QString>
 #include <QStringList>
 
@@ -11,16 +13,22 @@
 
 namespace Host {
 
+class PackageShelf;
+
 /// Carries out edits that are given in words. Clips, tracks and transitions go by the numbers that they had
 /// in the timeline's outline at the start; what an edit makes is numbered on from there. Clips go by their
 /// names as well.
 class EditScript
 {
 public:
-    explicit EditScript(EditSession& session);
+    /// Media that are added go to the timeline, and to these places besides. Titles and transitions may come
+    /// from the shelf, which outlives the script.
+    explicit EditScript(EditSession& session, const FileAdder::Contexts& places = {},
+                        const PackageShelf* shelf = nullptr);
     EditScript(const EditScript&) = delete;
 
-    /// One command. Throws Refusal, by which the command is named, and has changed nothing then.
+    /// One command. Throws Refusal, by which the command is named, and has changed nothing of the timeline
+    /// then; a file may stand in the other places already.
     void run(const QStringList& words);
 
 private:
@@ -66,6 +74,8 @@ private:
     void numberTheNew();
 
     EditSession& m_session;
+    FileAdder::Contexts m_places;
+    const PackageShelf* m_shelf;
     MediaClips m_media;
     std::vector<const Timeline::Clip*> m_clips;
     std::vector<const Timeline::Track*> m_tracks;

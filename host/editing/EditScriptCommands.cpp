@@ -2,8 +2,11 @@
 // What the commands of a script do.
 #include "host/editing/EditScript.h"
 
+#include "host/commands/Refusal.h"
 #include "host/editing/EditWords.h"
 #include "host/editing/Titles.h"
+#include "host/media/MediaAdding.h"
+#include "host/packages/PackageShelf.h"
 
 #include <EditorModel/effects/Transition.h>
 
@@ -21,15 +24,28 @@ const Track* trackFor(const Timeline::Object& timeline, TrackType type)
     return detached ? detached : timeline.findFirstTrack(type);
 }
 
+void requireAdded(const QString& path, const FileAdder::Contexts& places)
+{
+    const MediaAdding adding = addMedia({path}, places);
+    if (!adding.failures.empty()) {
+        throw Refusal(adding.failures.front().path, adding.failures.front().reason);
+    }
+}
+
 } // namespace
 
 EditResult EditScript::add(const QStringList& words)
 {
-    if (words.size() == 2) {
-        return lay(m_session, m_media.make(words[1]));
+    FileAdder::TimelineContext place(&timeline());
+    if (words.size() > 2) {
+        place.position = timeAt(words[2]);
+        if (place.position < MTime()) {
+            reject(quoted(words[2]) + " lies before the timeline");
+        }
     }
-    const MTime at = timeAt(words[2]);
-    return lay(m_session, m_media.make(words[1]), &at);
+    FileAdder::Contexts places = m_places;
+    requireAdded(words[1], places.setContext(place));
+    return {};
 }
 
 EditResult EditScript::overwrite(const QStringList& words)
@@ -38,9 +54,12 @@ EditResult EditScript::overwrite(const QStringList& words)
     const Track* const wished = words.size() > 3 ? trackAt(words[3]) : nullptr;
     const int level = words.size() > 4 ? levelAt(words[4]) : 0;
     const MediaClips::Clips clips = m_media.make(words[1]);
+    if (m_places.userCollection || m_places.resourceTable) {
+        requireAdded(words[1], m_places);
+    }
     const Track* const track = wished ? wished : trackFor(timeline(), clips.track);
     if (!track) {
-        return lay(m_session, clips, &at);
+        return lay(m_session, clips, LayingPlace{nullptr, level, at});
     }
     Placement placement(clips.clip, track, level);
     placement.nativeAudio = clips.nativeAudio;
@@ -61,7 +80,7 @@ EditResult EditScript::title(const QStringList& words)
     if (words.size() > 3 && !(length > MTime())) {
         reject(quoted(words[3]) + " is no length of a title");
     }
-    return layTitle(m_session, titleOf(words[1]), {at, length, track});
+    return layTitle(m_session, titleOf(words[1], m_shelf), {at, length, track});
 }
 
 EditResult EditScript::move(const QStringList& words)
@@ -161,7 +180,11 @@ EditResult EditScript::addTransition(const QStringList& words)
     }
     const QString name = words.size() > 5 ? words[5] : "dissolve";
     Transition::Object* const transition = m_session.makeTransition(name);
-    transition->tag = name;
+    if (const auto* const packaged = m_shelf ? m_shelf->find<Transition::Object>(name) : nullptr) {
+        *transition = *packaged;
+    } else {
+        transition->tag = name;
+    }
     return m_session.addTransition(transition, pair, wish);
 }
 

@@ -3,10 +3,12 @@
 
 #include "host/commands/Refusal.h"
 #include "host/editing/TimelineInvariants.h"
+#include "host/packages/PackageShelf.h"
 #include "host/project/DocumentFile.h"
 
 #include <QFileInfo>
 
+#include <optional>
 #include <set>
 
 namespace Host {
@@ -40,21 +42,50 @@ MTime lengthOf(const Overlay::Preset& preset, MTime wish)
     return preset.sourceDuration > MTime() ? preset.sourceDuration : Clip::DEFAULT_TITLE_CLIP_DURATION;
 }
 
+QString nameOf(const Overlay::Preset& preset, const QString& otherwise)
+{
+    return preset.tag.isEmpty() ? otherwise : preset.tag;
+}
+
+/// None if no package has the preset.
+std::optional<Title> packagedTitle(const QString& word, const PackageShelf& shelf)
+{
+    const QString id = word.section('=', 0, 0);
+    const auto* const found = shelf.find<Overlay::Preset>(id);
+    if (!found) {
+        return std::nullopt;
+    }
+    if (id == word) {
+        return Title{nameOf(*found, id), *found};
+    }
+    if (found->items.empty()) {
+        throw Refusal(id, "has no item for the text");
+    }
+    Title title{word.section('=', 1), *found};
+    title.preset.items.front().setText(title.name);
+    return title;
+}
+
 } // namespace
 
-Title titleOf(const QString& textOrPath)
+Title titleOf(const QString& word, const PackageShelf* shelf)
 {
-    if (!Document::formOfPath(textOrPath)) {
-        Overlay::Preset preset;
-        preset.appendItem(Overlay::Item().setText(textOrPath));
-        return {textOrPath, preset};
+    if (shelf) {
+        if (auto title = packagedTitle(word, *shelf)) {
+            return *title;
+        }
     }
-    const Document::Graph graph = loadDocument(textOrPath);
+    if (!Document::formOfPath(word)) {
+        Overlay::Preset preset;
+        preset.appendItem(Overlay::Item().setText(word));
+        return {word, preset};
+    }
+    const Document::Graph graph = loadDocument(word);
     const auto* const preset = graph.rootAs<Overlay::Preset>();
     if (!preset) {
-        throw Refusal(textOrPath, "holds no title, but " + contentOf(graph));
+        throw Refusal(word, "holds no title, but " + contentOf(graph));
     }
-    return {preset->tag.isEmpty() ? QFileInfo(textOrPath).completeBaseName() : preset->tag, *preset};
+    return {nameOf(*preset, QFileInfo(word).completeBaseName()), *preset};
 }
 
 EditResult layTitle(EditSession& session, const Title& title, const TitlePlace& place)

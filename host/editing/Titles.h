@@ -9,6 +9,8 @@
 
 namespace Host {
 
+class PackageShelf;
+
 /// What a title is to show, by the name that its clip gets.
 struct Title
 {
@@ -16,9 +18,13 @@ struct Title
     Overlay::Preset preset;
 };
 
-/// A preset of a single text; where the text is the name of a document, by its ending, the preset in that.
-/// Throws Refusal where the document is missing or holds no preset, and Document::Error.
-Title titleOf(const QString& textOrPath);
+/// What a word of a command stands for, the first of
+/// - the preset of a package with this identifier; behind it "=" and the text of its first item may stand;
+/// - where the word is the name of a document, by its ending, the preset in that;
+/// - a preset of this text alone.
+/// The shelf may be null. Throws Refusal where the document is missing or holds no preset, or the preset no
+/// item for the text, and Document::Error.
+Title titleOf(const QString& word, const PackageShelf* shelf = nullptr);
 
 struct TitlePlace
 {

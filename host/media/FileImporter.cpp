@@ -259,9 +259,13 @@ EditResult FileImporter::Run::layClips(Candidate& candidate, const FileAdder::Ti
     } catch (const Refusal& refusal) {
         return {refusal.reason};
     }
-    const EditResult laid = lay(session, clips, places.of(clips.track));
+    EditResult laid = lay(session, clips, places.of(clips.track));
+    if (!laid) {
+        laid.refusal.prepend("can't be laid: ");
+        return laid;
+    }
     // Whoever heard of the clip may have removed it.
-    if (laid && session.timeline()->contains(clips.clip)) {
+    if (session.timeline()->contains(clips.clip)) {
         places.noteLaid(clips.track, session.timeline()->clipTiming(clips.clip).end());
     }
     return laid;

@@ -27,7 +27,7 @@ public:
     /// As it was asked for.
     QString path;
     Place place;
-    /// One line: it completes the sentence "The file ...", or is one that tells why an edit is refused.
+    /// One line that completes the sentence "The file ...".
     QString reason;
 };
 

@@ -178,13 +178,4 @@ EditResult lay(EditSession& session, const MediaClips::Clips& clips, const Layin
     return result;
 }
 
-EditResult lay(EditSession& session, const MediaClips::Clips& clips, const MTime* at)
-{
-    LayingPlace where;
-    if (at) {
-        where.at = *at;
-    }
-    return lay(session, clips, where);
-}
-
 } // namespace Host

@@ -71,7 +71,5 @@ struct LayingPlace
 /// Makes the tracks that are missing, that of native audio among them. Where the clips are refused, these go
 /// again.
 EditResult lay(EditSession& session, const MediaClips::Clips& clips, const LayingPlace& place);
-/// At the end of the first track of their type, or at a time.
-EditResult lay(EditSession& session, const MediaClips::Clips& clips, const MTime* at = nullptr);
 
 } // namespace Host

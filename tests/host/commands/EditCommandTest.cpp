@@ -5,8 +5,12 @@
 #include "host/project/ProjectDocument.h"
 #include "host/timeline/TimelineOutline.h"
 
+#include <EditorModel/effects/Overlay.h>
 #include <EditorModel/effects/Transition.h>
+#include <EditorModel/library/ImportObject.h>
+#include <EditorModel/library/UserObject.h>
 #include <EditorModel/media/File.h>
+#include <EditorModel/media/ResourceTable.h>
 
 #include <QFileInfo>
 
@@ -278,8 +282,7 @@ TEST(EditCommand, NumbersWhatItMakesBehindWhatTheDocumentHad)
 {
     const Project project;
     // The right part and its sound are 7 and 8; the numbers of the others stay.
-    const ProjectDocument document =
-        project.edited("split 3 8 then delete 1 then delete 7 then fade-in 6 1");
+    const ProjectDocument document = project.edited("split 3 8 then delete 1 then delete 7 then fade-in 6 1");
     EXPECT_EQ(document.timeline().clips.size(), 4u);
     EXPECT_EQ(document.timeline().duration(), MTime(8000));
 }
@@ -364,6 +367,47 @@ TEST(EditCommand, KeepsWhatElseTheDocumentHolds)
     ASSERT_TRUE(graph.rootAs<Media::File>());
     EXPECT_EQ(graph.rootAs<Media::File>()->path, "other.wav");
     EXPECT_EQ(Host::timelineOf(graph)->clips.size(), 5u);
+}
+
+TEST(EditCommand, TakesTitlesFromPackagesThatAreSound)
+{
+    const Project project;
+    const QString starter = QString(HOST_PACKAGES "/starter");
+    const QStringList title = {"title", "starter.opening-title=The film", "0.5", "1"};
+    const QStringList edit = {"edit", project.path(), "--packages", starter};
+    EXPECT_EQ(editormodel(edit + title).errors, "");
+    const ProjectDocument document = ProjectDocument::load(project.path());
+    const Timeline::Object& timeline = document.timeline();
+    const auto titles = timeline.clipsAt(timeline.titleTrack());
+    ASSERT_EQ(titles.size(), 1u);
+    EXPECT_EQ((*titles.begin())->name, "The film");
+    EXPECT_EQ((*titles.begin())->overlay->items.front().text, "The film");
+
+    const Folder folder;
+    folder.write("package.json", "{}");
+    const QByteArray before = contentOf(project.path());
+    const Outcome outcome =
+        editormodel(QStringList{"edit", project.path(), "--packages", folder.path()} + title);
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_THAT(outcome.errors,
+                StartsWith(QFileInfo(folder.path()).fileName().toStdString() + ": package.json: "));
+    EXPECT_EQ(contentOf(project.path()), before);
+}
+
+TEST(EditCommand, ListsAddedMediaInTheWholeProject)
+{
+    const Project project;
+    const ProjectDocument document = project.edited("add picture.jpg");
+    std::vector<QString> items;
+    for (const Import::Object* item : document.project()->userCollection->items) {
+        items.push_back(item->tag);
+    }
+    EXPECT_THAT(items,
+                testing::ElementsAre("film.mp4", "picture.png", "long.mkv", "speech.wav", "picture.jpg"));
+    const auto& table = document.project()->resourceTable->resource2fileInfo;
+    EXPECT_TRUE(std::any_of(table.begin(), table.end(), [](const auto& entry) {
+        return entry.second.info.path == sample("picture.jpg");
+    }));
 }
 
 } // namespace

@@ -1,10 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Edits.h"
+#include "tests/host/packages/PackageBuilder.h"
 #include "tests/host/shared/Samples.h"
 
 #include "host/commands/Refusal.h"
 #include "host/editing/EditScript.h"
+#include "host/media/CollectionKeeper.h"
+#include "host/media/FileImporter.h"
 #include "host/media/MediaOpener.h"
+#include "host/packages/PackageShelf.h"
 
 #include <EditorModel/effects/Overlay.h>
 #include <EditorModel/persistence/Document.h>
@@ -53,6 +57,7 @@ protected:
     const Host::MediaOpener opener;
     const HostTests::Folder folder;
     EditSession session;
+    const Host::FileImporter importer{session};
     Track* primary = session.makeTrack(PrimaryTrack);
     Clip* a = session.makeClip(Clip::VideoClip);
     Clip* b = session.makeClip(Clip::VideoClip);
@@ -155,6 +160,109 @@ TEST_F(EditScript, OverwritesWithAFile)
     EXPECT_EQ(row(now(), now().detachedAudioTrack()), "speech.wav 1000-2000 @0, speech.wav 2000-3500 @0");
     EXPECT_EQ(refusalOf({"overwrite", HostTests::sample("picture.png"), "0", "3", "high"}),
               "\"high\" is no level");
+}
+
+TEST_F(EditScript, AddsMediaToTheOtherPlacesOfTheProject)
+{
+    EditorCollection::UserObject collection;
+    const Host::CollectionKeeper keeper(&collection);
+    FileAdder::Contexts places;
+    script =
+        std::make_unique<Host::EditScript>(session, places.setContext(FileAdder::UserCollectionContext()));
+    const auto listed = [&] {
+        std::string names;
+        for (const Import::Object* item : collection.items) {
+            names += item->tag.toStdString() + '\n';
+        }
+        return names;
+    };
+    run({"add", HostTests::sample("picture.png")});
+    EXPECT_EQ(row(now(), primary), "a 0-10000 @0, b 10000-20000 @0, picture.png 20000-24000 @0");
+    EXPECT_EQ(listed(), "picture.png\n");
+    run({"overwrite", HostTests::sample("film.mp4"), "9"});
+    EXPECT_EQ(listed(), "picture.png\nfilm.mp4\n");
+    // What can't be opened stands nowhere.
+    EXPECT_THAT(refusalOf({"overwrite", "nobody.mp4", "9"}), StartsWith("nobody.mp4 does not exist"));
+    EXPECT_EQ(listed(), "picture.png\nfilm.mp4\n");
+}
+
+TEST_F(EditScript, TellsWhyMediaAreNotAdded)
+{
+    EXPECT_EQ(refusalOf({"add", HostTests::sample("picture.png"), "-1ms"}),
+              "\"-1ms\" lies before the timeline");
+    EXPECT_THAT(refusalOf({"add", HostTests::sample("picture.png"), "5ms"}),
+                StartsWith(HostTests::sample("picture.png").toStdString() +
+                           " can't be laid: The clip \"a\" can't be split at 00:00:00.005: "));
+    EditSession alone;
+    Host::EditScript lonely(alone);
+    try {
+        lonely.run({"add", HostTests::sample("picture.png")});
+        ADD_FAILURE() << "nobody can add it";
+    } catch (const Host::Refusal& refusal) {
+        EXPECT_THAT(refusal.reason.toStdString(), testing::HasSubstr("picture.png"));
+    }
+    EXPECT_THAT(alone.timeline()->clips, IsEmpty());
+}
+
+/// A package with a title of two texts, an empty one, and a transition.
+class PackagedEditScript : public EditScript
+{
+protected:
+    PackagedEditScript()
+    {
+        HostTests::PackageBuilder package(folder.path("extras"), "extras");
+        Overlay::Preset banner;
+        banner.setTag("Banner")->setSourceDuration(2500);
+        banner.appendItem(Overlay::Item().setText("above"))->appendItem(Overlay::Item().setText("below"));
+        package.write("banner.json", banner);
+        package.write("bare.json", Overlay::Preset());
+        Transition::Object wipe("wipe");
+        wipe.tag = "Wipe";
+        wipe.type = static_cast<Transition::Object::Type>(3);
+        package.write("wipe.json", wipe);
+        using HostTests::PackageBuilder;
+        package.description.overlays = {PackageBuilder::addOn(
+            {{"banners", "Title"}}, {PackageBuilder::resource("extras.banner", "banner.json"),
+                                     PackageBuilder::resource("extras.bare", "bare.json")})};
+        package.description.transitions = {PackageBuilder::addOn(
+            {{"wipes", "Transitions"}}, {PackageBuilder::resource("extras.wipe", "wipe.json")})};
+        package.writeDescription();
+        EXPECT_EQ(shelf.put(folder.path("extras")), 1u);
+        EXPECT_THAT(shelf.faults(), IsEmpty());
+        script = std::make_unique<Host::EditScript>(session, FileAdder::Contexts(), &shelf);
+    }
+
+    Host::PackageShelf shelf;
+};
+
+TEST_F(PackagedEditScript, TakesTitlesFromPackages)
+{
+    run({"title", "extras.banner", "1"});
+    run({"title", "extras.banner=Once = upon a time", "5", "2"});
+    EXPECT_EQ(titles(), "Banner 1000-3500 @0, Once = upon a time 5000-7000 @0");
+    EXPECT_EQ(presetAt(2000)->items.front().text, "above");
+    const Overlay::Preset* const own = presetAt(6000);
+    ASSERT_EQ(own->items.size(), 2u);
+    EXPECT_EQ(own->items.front().text, "Once = upon a time");
+    EXPECT_EQ(own->items.back().text, "below");
+    // The package's own preset keeps its text.
+    EXPECT_EQ(shelf.find<Overlay::Preset>("extras.banner")->items.front().text, "above");
+    EXPECT_EQ(refusalOf({"title", "extras.bare=text", "1"}), "extras.bare has no item for the text");
+    run({"title", "extras.unknown", "8", "1"});
+    EXPECT_EQ(presetAt(8500)->items.front().text, "extras.unknown");
+}
+
+TEST_F(PackagedEditScript, TakesTransitionsFromPackages)
+{
+    EXPECT_TRUE(session.trimRight(a, 1000, Host::Ripple::Yes));
+    EXPECT_TRUE(session.trimLeft(b, 1000, Host::Ripple::Yes));
+    run({"transition", "add", "a", "b", "1", "extras.wipe"});
+    ASSERT_EQ(now().transitions.size(), 1u);
+    const Transition::Object& laid = *now().transitions.begin()->first;
+    EXPECT_EQ(laid.id, "wipe");
+    EXPECT_EQ(laid.tag, "Wipe");
+    EXPECT_EQ(laid.type, 3);
+    EXPECT_NE(&laid, shelf.find<Transition::Object>("extras.wipe"));
 }
 
 } // namespace

@@ -49,15 +49,17 @@ TEST_F(FileImporterTimeline, RefusesTracksThatDoNotTakeTheFileAndLaysTheOthers)
     const Track* const primary = addTrack(PrimaryTrack);
     const Track* const native = addTrack(NativeAudioTrack);
     EXPECT_EQ(lay({wav, png}, TimelineContext(now(), primary, 0, -1)), Importer::SomeAdded);
-    EXPECT_EQ(heard(), Lines({
-                           "asked: speech.wav picture.png",
-                           "opened speech.wav",
-                           "opened picture.png",
-                           "speech.wav not in timeline: The clip \"speech.wav\" can't lie at 00:00:00.000: "
-                           "the track takes no sound.",
-                           "primary: picture.png 0-4000 @0; native:",
-                           "answer 2: picture.png",
-                       }));
+    EXPECT_EQ(
+        heard(),
+        Lines({
+            "asked: speech.wav picture.png",
+            "opened speech.wav",
+            "opened picture.png",
+            "speech.wav not in timeline: can't be laid: The clip \"speech.wav\" can't lie at 00:00:00.000: "
+            "the track takes no sound.",
+            "primary: picture.png 0-4000 @0; native:",
+            "answer 2: picture.png",
+        }));
     const Track elsewhere(PrimaryTrack);
     const std::tuple<const Track*, int, const char*> refused[] = {
         {native, 0, "on a native audio track by itself"},
@@ -82,7 +84,7 @@ TEST_F(FileImporterTimeline, LeavesNeitherAGapNorATrackForWhatIsRefusedAtAPositi
     EXPECT_EQ(lay({film, wav, png}, TimelineContext(now(), nullptr, -1, 5)), Importer::SomeAdded);
     const std::string primary = "primary: picture.png 0-4000 @0";
     const std::string reason =
-        ": The clip \"picture.png\" can't be split at 00:00:00.005: there must be a clip "
+        ": can't be laid: The clip \"picture.png\" can't be split at 00:00:00.005: there must be a clip "
         "of 00:00:00.010 on either side, beside the transitions.";
     EXPECT_EQ(heard(), Lines({
                            "asked: film.mp4 speech.wav picture.png",
