@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "host/commands/CheckCommand.h"
+#include "host/commands/CompareCommand.h"
 #include "host/commands/Console.h"
 #include "host/commands/ConvertCommand.h"
 #include "host/commands/CurveCommand.h"
@@ -170,6 +171,11 @@ Host::ExitCode runConvert(const Arguments& arguments)
     return Host::convert(options);
 }
 
+Host::ExitCode runCompare(const Arguments& arguments)
+{
+    return Host::compareDocuments(fileName(arguments.document), fileNames(arguments.files));
+}
+
 Host::ExitCode runPackages(const Arguments& arguments)
 {
     return Host::showPackages(fileNames(arguments.files));
@@ -321,6 +327,17 @@ void addConvert(CLI::App& app, Arguments& arguments)
     convert->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
 }
 
+void addCompare(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const compare =
+        addCommand(app, arguments, "compare", "Tell whether documents hold the same", runCompare);
+    compare->add_option("FIRST", arguments.document, "A project or a document")->required()->type_name("");
+    compare->add_option("OTHER", arguments.files, "What is compared with it")->required()->type_name("");
+    compare->footer(
+        "The command ends with 0 if all are the same, 1 if one differs, 2 if one can't be read.\n");
+    compare->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
+}
+
 void addPackages(CLI::App& app, Arguments& arguments)
 {
     CLI::App* const packages = addCommand(
@@ -373,6 +390,7 @@ int main(int argc, char** argv)
     addPicture(app, arguments);
     addCheck(app, arguments);
     addConvert(app, arguments);
+    addCompare(app, arguments);
     addPackages(app, arguments);
     try {
         app.parse(argc, argv);
