@@ -10,6 +10,7 @@
 #include "host/commands/PictureCommand.h"
 #include "host/commands/ProbeCommand.h"
 #include "host/commands/ShowCommand.h"
+#include "host/commands/TrackCommand.h"
 #include "host/media/MediaProbe.h"
 #include "host/project/FaultList.h"
 #include "host/text/DisplayText.h"
@@ -106,6 +107,10 @@ struct Arguments
     bool isForced = false;
     bool isOwn = false;
 
+    std::string name;
+    std::vector<double> rectangle;
+    std::string id;
+
     std::string picture;
     Host::CurveOptions curve;
     qint64 length = 10000;
@@ -169,6 +174,14 @@ Host::ExitCode runConvert(const Arguments& arguments)
     options.isForced = arguments.isForced;
     options.isOwn = arguments.isOwn;
     return Host::convert(options);
+}
+
+Host::ExitCode runTrack(const Arguments& arguments)
+{
+    Host::showMediaLibraryLog(false);
+    const std::vector<double>& r = arguments.rectangle;
+    return Host::trackClip({fileName(arguments.document), fileName(arguments.name),
+                            QRectF(r[0], r[1], r[2], r[3]), fileName(arguments.id)});
 }
 
 Host::ExitCode runCompare(const Arguments& arguments)
@@ -327,6 +340,22 @@ void addConvert(CLI::App& app, Arguments& arguments)
     convert->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
 }
 
+void addTrack(CLI::App& app, Arguments& arguments)
+{
+    CLI::App* const track =
+        addCommand(app, arguments, "track", "Follow a part of the picture through a clip", runTrack);
+    track->add_option("PROJECT", arguments.document, "A document with a timeline")->required()->type_name("");
+    track->add_option("CLIP", arguments.name, "Its number or name")->required()->type_name("");
+    track
+        ->add_option("RECTANGLE", arguments.rectangle,
+                     "Left, top, width and height in its first picture, as parts of the picture's size")
+        ->required()
+        ->type_name("")
+        ->expected(4);
+    track->add_option("--id", arguments.id, "What to call it in edits and other commands")->type_name("NAME");
+    track->parse_complete_callback([&arguments] { arguments.readsTimelines = true; });
+}
+
 void addCompare(CLI::App& app, Arguments& arguments)
 {
     CLI::App* const compare =
@@ -390,6 +419,7 @@ int main(int argc, char** argv)
     addPicture(app, arguments);
     addCheck(app, arguments);
     addConvert(app, arguments);
+    addTrack(app, arguments);
     addCompare(app, arguments);
     addPackages(app, arguments);
     try {

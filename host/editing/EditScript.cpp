@@ -13,21 +13,6 @@ namespace {
 using Timeline::Clip;
 using Timeline::Track;
 
-/// By its number, from 1 on; null for what is no number of anything.
-template <class T>
-const T* numbered(const std::vector<const T*>& objects, const QString& word)
-{
-    bool isNumber = false;
-    const uint number = word.toUInt(&isNumber);
-    return isNumber && number >= 1 && number <= objects.size() ? objects[number - 1] : nullptr;
-}
-
-/// The sound of a video has its name, and is edited by way of the video.
-bool isPartOfVideo(const Timeline::Object& timeline, const Clip* clip)
-{
-    return timeline.isNativeAudio(clip) && timeline.isSlave(clip);
-}
-
 template <class T>
 void append(std::vector<const T*>& numbered, const std::vector<const T*>& present)
 {
@@ -106,21 +91,7 @@ const EditScript::Command& EditScript::commandFor(const QStringList& words)
 
 const Clip* EditScript::clipAt(const QString& word) const
 {
-    const Clip* found = numbered(m_clips, word);
-    if (!found) {
-        for (const Clip* clip : m_clips) {
-            if (timeline().contains(clip) && nameOf(*clip) == word && !isPartOfVideo(timeline(), clip)) {
-                if (found) {
-                    reject("there are several clips " + quoted(word) + ": give the number of one");
-                }
-                found = clip;
-            }
-        }
-    }
-    if (!found || !timeline().contains(found)) {
-        reject("there is no clip " + quoted(word));
-    }
-    return found;
+    return clipOf(timeline(), m_clips, word);
 }
 
 const Track* EditScript::trackAt(const QString& word) const

@@ -9,6 +9,18 @@
 
 namespace Host {
 
+using Timeline::Clip;
+
+namespace {
+
+/// The sound of a video has its name, and is edited by way of the video.
+bool isPartOfVideo(const Timeline::Object& timeline, const Clip* clip)
+{
+    return timeline.isNativeAudio(clip) && timeline.isSlave(clip);
+}
+
+} // namespace
+
 QString quoted(const QString& word)
 {
     return '"' + word + '"';
@@ -26,6 +38,26 @@ MTime timeAt(const QString& word)
         reject(quoted(word) + " is no time: 1:02.5, 62.5 and 62500ms are");
     }
     return *time;
+}
+
+const Clip* clipOf(const Timeline::Object& timeline, const std::vector<const Clip*>& clips,
+                   const QString& word)
+{
+    const Clip* found = numbered(clips, word);
+    if (!found) {
+        for (const Clip* clip : clips) {
+            if (timeline.contains(clip) && nameOf(*clip) == word && !isPartOfVideo(timeline, clip)) {
+                if (found) {
+                    reject("there are several clips " + quoted(word) + ": give the number of one");
+                }
+                found = clip;
+            }
+        }
+    }
+    if (!found || !timeline.contains(found)) {
+        reject("there is no clip " + quoted(word));
+    }
+    return found;
 }
 
 double factorAt(const QString& word)

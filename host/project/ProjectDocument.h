@@ -24,6 +24,9 @@ public:
     /// The project's, or the first root that is one. Throws Refusal where there is none.
     Timeline::Object& timeline() const;
 
+    /// A clip of a timeline in the document, which owns it: nobody else has claimed it constant.
+    Timeline::Clip& writable(const Timeline::Clip& clip) const { return const_cast<Timeline::Clip&>(clip); }
+
     /// As what it was loaded as, with what else it holds. The file is replaced as a whole or not at all; its
     /// ending tells the form. Throws Refusal for another ending, and Document::Error.
     void save(const QString& path) const;
