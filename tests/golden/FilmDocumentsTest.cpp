@@ -1,20 +1,18 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with a film and an editor look like, written down by hand. Stored data is for life: these
 // texts are never written anew from what the code gives.
+#include "XmlArchives.h"
+
 #include <EditorModel/effects/Transition.h>
 #include <EditorModel/timeline/Editor.h>
 #include <EditorModel/timeline/Film.h>
 #include <EditorModel/timeline/Timeline.h>
 
-#include <boost/archive/xml_iarchive.hpp>
-#include <boost/archive/xml_oarchive.hpp>
-#include <boost/serialization/nvp.hpp>
-
 #include <gtest/gtest.h>
 
-#include <sstream>
-
 namespace {
+
+using namespace GoldenTests;
 
 constexpr const char* film = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
 <!DOCTYPE boost_serialization>
@@ -66,25 +64,6 @@ constexpr const char* editor = R"(<?xml version="1.0" encoding="UTF-8" standalon
 </boost_serialization>
 
 )";
-
-template <class T>
-std::string saved(const T& content)
-{
-    std::ostringstream stream;
-    {
-        boost::archive::xml_oarchive archive(stream);
-        archive << BOOST_SERIALIZATION_NVP(content);
-    }
-    return stream.str();
-}
-
-template <class T>
-void load(const char* document, T& content)
-{
-    std::istringstream stored(document);
-    boost::archive::xml_iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
-}
 
 // The bindings and lists hold null alone, so that no other class's fields stand in the documents.
 

@@ -1,21 +1,20 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with packages, marks and items of collections look like, written down by hand. Stored data
 // is for life: these texts are never written anew from what the code gives.
+#include "XmlArchives.h"
+
 #include <EditorModel/library/Indication.h>
 #include <EditorModel/library/PackageContent.h>
 #include <EditorModel/library/PackageStorage.h>
 #include <EditorModel/library/PersistentItem.h>
 
-#include <boost/archive/xml_iarchive.hpp>
-#include <boost/archive/xml_oarchive.hpp>
-#include <boost/serialization/nvp.hpp>
-
 #include <gtest/gtest.h>
 
-#include <sstream>
 #include <string>
 
 namespace {
+
+using namespace GoldenTests;
 
 const std::string begin = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
 <!DOCTYPE boost_serialization>
@@ -151,27 +150,6 @@ const std::string item = begin + R"(	<uniqueId>{1}</uniqueId>
 	</customStrings>
 )" + end;
 
-template <class T>
-std::string saved(const T& content)
-{
-    std::ostringstream stream;
-    {
-        boost::archive::xml_oarchive archive(stream);
-        archive << BOOST_SERIALIZATION_NVP(content);
-    }
-    return stream.str();
-}
-
-template <class T>
-T loaded(const std::string& document)
-{
-    T content;
-    std::istringstream stored(document);
-    boost::archive::xml_iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
-    return content;
-}
-
 TEST(PackageDocuments, TheXmlArchiveIsAsWrittenDown)
 {
     Package::Resource resource;
@@ -191,7 +169,8 @@ TEST(PackageDocuments, TheXmlArchiveIsAsWrittenDown)
     written.fontsDir = "fonts";
     EXPECT_EQ(saved(written), package);
 
-    const auto read = loaded<Package::Object>(package);
+    Package::Object read;
+    load(package, read);
     EXPECT_EQ(saved(read), package);
     ASSERT_EQ(read.overlays.size(), 1u);
     ASSERT_EQ(read.overlays[0].resources.size(), 1u);
@@ -206,7 +185,9 @@ TEST(PackageStorageDocuments, TheXmlArchiveIsAsWrittenDown)
     stored.collection2tags = {{"Title", {"Rain", "Sun"}}};
     stored.collection2categories = {{"Title", {"Weather"}}};
     EXPECT_EQ(saved(written), storage);
-    EXPECT_EQ(saved(loaded<Package::Storage>(storage)), storage);
+    Package::Storage read;
+    load(storage, read);
+    EXPECT_EQ(saved(read), storage);
 }
 
 TEST(IndicationDocuments, TheXmlArchiveIsAsWrittenDown)
@@ -215,7 +196,8 @@ TEST(IndicationDocuments, TheXmlArchiveIsAsWrittenDown)
     written.setId("Effects").setFavorite("blur", true).setNew("glow", true).setNew("haze", true);
     EXPECT_EQ(saved(written), marks);
 
-    const auto read = loaded<Indication::Object>(marks);
+    Indication::Object read;
+    load(marks, read);
     EXPECT_EQ(saved(read), marks);
     EXPECT_TRUE(read.isFavorite("blur"));
     EXPECT_TRUE(read.isNew("haze"));
@@ -231,7 +213,8 @@ TEST(ItemDocuments, TheXmlArchiveIsAsWrittenDown)
     written.customStrings = {{"author", "me"}};
     EXPECT_EQ(saved(written), item);
 
-    const auto read = loaded<Item>(item);
+    Item read;
+    load(item, read);
     EXPECT_EQ(saved(read), item);
     EXPECT_EQ(read.collectionId, "Transitions");
     EXPECT_EQ(read.preview, nullptr);

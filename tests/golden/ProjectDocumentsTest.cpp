@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with a project and with what collections store look like, written down by hand. Stored data
 // is for life: these texts are never written anew from what the code gives.
+#include "XmlArchives.h"
+
 #include <EditorModel/library/EditorCollection.h>
 #include <EditorModel/library/ImportObject.h>
 #include <EditorModel/library/Indication.h>
@@ -9,18 +11,15 @@
 #include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/timeline/Timeline.h>
 
-#include <boost/archive/xml_iarchive.hpp>
-#include <boost/archive/xml_oarchive.hpp>
-#include <boost/serialization/nvp.hpp>
-
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 #include <memory>
-#include <sstream>
 #include <string>
 
 namespace {
+
+using namespace GoldenTests;
 
 using ::testing::ElementsAre;
 using ::testing::IsEmpty;
@@ -120,25 +119,6 @@ constexpr const char* quizItem = R"(<?xml version="1.0" encoding="UTF-8" standal
 </boost_serialization>
 
 )";
-
-template <class T>
-std::string saved(const T& content)
-{
-    std::ostringstream stream;
-    {
-        boost::archive::xml_oarchive archive(stream);
-        archive << BOOST_SERIALIZATION_NVP(content);
-    }
-    return stream.str();
-}
-
-template <class T>
-void load(const char* document, T& content)
-{
-    std::istringstream stored(document);
-    boost::archive::xml_iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
-}
 
 TEST(ProjectDocuments, TheXmlArchiveIsAsWrittenDown)
 {
