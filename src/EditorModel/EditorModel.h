@@ -8,6 +8,7 @@
 #include <EditorModel/analysis/BeatDetection.h>
 #include <EditorModel/analysis/ClipSynchronization.h>
 #include <EditorModel/analysis/MotionTracking.h>
+#include <EditorModel/analysis/OverlayLinkInfo.h>
 #include <EditorModel/analysis/SceneDetection.h>
 #include <EditorModel/analysis/Stabilization.h>
 #include <EditorModel/analysis/TrackingData.h>
@@ -62,6 +63,7 @@
 #include <EditorModel/media/ResourceInfo.h>
 #include <EditorModel/media/ResourceRef.h>
 #include <EditorModel/media/ResourceTable.h>
+#include <EditorModel/media/Source.h>
 #include <EditorModel/media/TimingMode.h>
 #include <EditorModel/media/Video.h>
 #include <EditorModel/media/Views.h>

@@ -5,6 +5,7 @@
 #include <EditorModel/media/File.h>
 #include <EditorModel/media/FileTarget.h>
 #include <EditorModel/media/Object.h>
+#include <EditorModel/media/Source.h>
 #include <EditorModel/media/TimingMode.h>
 #include <EditorModel/media/Video.h>
 #include <EditorModel/media/Views.h>
