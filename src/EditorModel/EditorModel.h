@@ -7,13 +7,17 @@
 #include <EditorModel/Export.h>
 #include <EditorModel/analysis/BeatDetection.h>
 #include <EditorModel/analysis/ClipSynchronization.h>
+#include <EditorModel/analysis/Filmstrip.h>
 #include <EditorModel/analysis/MotionTracking.h>
 #include <EditorModel/analysis/OverlayLinkInfo.h>
 #include <EditorModel/analysis/SceneDetection.h>
 #include <EditorModel/analysis/Stabilization.h>
+#include <EditorModel/analysis/Thumbnail.h>
 #include <EditorModel/analysis/TrackingData.h>
 #include <EditorModel/analysis/TrackingHelper.h>
 #include <EditorModel/analysis/TrackingTask.h>
+#include <EditorModel/analysis/VUMeter.h>
+#include <EditorModel/analysis/Waveform.h>
 #include <EditorModel/bus/Messages.h>
 #include <EditorModel/bus/Preview.h>
 #include <EditorModel/bus/PubSub.h>
