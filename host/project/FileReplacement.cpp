@@ -293,7 +293,8 @@ fs::path withEnding(fs::path file, const QString& ending)
 
 } // namespace
 
-void replaceFile(const QString& path, const std::vector<QByteArray>& parts, const QString& ending)
+void replaceFile(const QString& path, const std::vector<QByteArray>& parts,
+                 const std::function<QString()>& ending)
 {
     const fs::path file = followed(path);
     const std::optional<struct stat> old = statusOf(file);
@@ -309,7 +310,7 @@ void replaceFile(const QString& path, const std::vector<QByteArray>& parts, cons
     }
     draft.flush();
     if (old) {
-        keepBackup(file, withEnding(file, ending), *old);
+        keepBackup(file, withEnding(file, ending()), *old);
     }
     draft.place(file);
     flushFolder(folderOf(file));

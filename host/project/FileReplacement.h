@@ -4,6 +4,7 @@
 #include <QByteArray>
 #include <QString>
 
+#include <functional>
 #include <stdexcept>
 #include <vector>
 
@@ -17,14 +18,16 @@ public:
     using std::runtime_error::runtime_error;
 };
 
-/// Gives a file new content, the parts one after another, and keeps the old file under its name with `ending`
-/// behind it. Whenever the process or the machine stops, the name stands for the old content or the new one,
-/// whole, and so does that of the old file.
+/// Gives a file new content, the parts one after another, and keeps the old file under its name with an
+/// ending behind it, in place of what was kept so before. The ending is asked for when no other process saves
+/// the file, and only where there is an old one. Whenever the process or the machine stops, the name stands
+/// for the old content or the new one, whole, and so does that of the old file.
 ///
 /// The content is on the disk when this returns. The permissions of the old file are kept, and its owner
 /// where the process may give it away. A link is followed and stays. One process at a time saves a file; what
 /// one that was killed has left is removed. Throws ReplacementFailed.
-void replaceFile(const QString& path, const std::vector<QByteArray>& parts, const QString& ending);
+void replaceFile(const QString& path, const std::vector<QByteArray>& parts,
+                 const std::function<QString()>& ending);
 
 /// A name beside the file that links lead to: its own with the ending. So replaceFile() names the old file.
 /// Throws ReplacementFailed for links that lead in a circle.

@@ -19,6 +19,7 @@ namespace Host {
 namespace {
 
 constexpr const char* backupEnding = ".backup";
+constexpr const char* replacedEnding = ".replaced";
 
 [[noreturn]] void refuse(const QString& path, const std::string& reason)
 {
@@ -68,12 +69,36 @@ QByteArray bytesOf(const QString& path)
     return bytes;
 }
 
-Document::Graph graphOf(const QByteArray& file)
+/// Throws Document::Error for what is no whole project.
+QByteArray documentIn(const QByteArray& file)
 {
     if (!isProjectFile(file, file)) {
         throw Document::Error("", "", "is no project");
     }
-    QByteArray document = projectDocument(file);
+    return projectDocument(file);
+}
+
+/// By its marks and its checksum.
+bool isWhole(const QString& path)
+{
+    try {
+        const QByteArray file = bytesOf(path);
+        documentIn(file);
+        return true;
+    } catch (const Document::Error&) {
+        return false;
+    }
+}
+
+/// As what the file is kept that a save replaces.
+const char* endingForOld(const QString& path)
+{
+    return isWhole(path) || !isWhole(ProjectStore::backupOf(path)) ? backupEnding : replacedEnding;
+}
+
+Document::Graph graphOf(const QByteArray& file)
+{
+    QByteArray document = documentIn(file);
     QBuffer buffer(&document);
     buffer.open(QIODevice::ReadOnly);
     return Document::load(buffer, Document::ForeignDocuments);
@@ -131,7 +156,7 @@ void ProjectStore::save(const Project::Content& content, const QString& path)
     try {
         const QByteArray document = documentOf(content, form);
         const ProjectSeal seal = projectSeal(document, form);
-        replaceFile(path, {seal.before, document, seal.behind}, backupEnding);
+        replaceFile(path, {seal.before, document, seal.behind}, [&path] { return endingForOld(path); });
     } catch (const Document::Error& error) {
         refuse(path, error);
     } catch (const ReplacementFailed& error) {

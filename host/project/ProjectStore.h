@@ -35,7 +35,8 @@ class ProjectStore
 {
 public:
     /// Replaces the file, and keeps the old one as backup, both whole at every instant; the ending of the
-    /// name tells the form. Where it fails the old file stands as it was.
+    /// name tells the form. An old file that is no whole project takes no whole backup's place: it is kept
+    /// beside it, with the ending ".replaced". Where it fails the old file stands as it was.
     static void save(const Project::Content& content, const QString& path);
 
     /// The file may be anybody's. Where it cannot be read and its backup can, the error says so.

@@ -87,6 +87,35 @@ TEST_F(ProjectSaving, KeepsTheOldFileAsBackup)
     EXPECT_EQ(names(), "film.json film.json.backup");
 }
 
+TEST_F(ProjectSaving, LetsNoDamagedFileTakeThePlaceOfAWholeBackup)
+{
+    const QByteArray whole = contentOf(m_path);
+    QByteArray altered = whole;
+    altered[whole.size() / 2] = altered[whole.size() / 2] == 'x' ? 'y' : 'x';
+    for (const QByteArray& damaged :
+         {whole.left(whole.size() / 2), altered, QByteArray(), QByteArray("Dear Sir or Madam,\n")}) {
+        m_folder.write("film.json", damaged);
+        SmallProject(3).save(m_path);
+        EXPECT_EQ(numberIn(m_path), 3);
+        EXPECT_EQ(numberInBackup(m_path), 1);
+        EXPECT_EQ(contentOf(m_path + ".replaced"), damaged);
+        EXPECT_EQ(names(), "film.json film.json.backup film.json.replaced");
+    }
+    // What was whole is the backup again.
+    SmallProject(4).save(m_path);
+    EXPECT_EQ(numberInBackup(m_path), 3);
+    EXPECT_EQ(contentOf(m_path + ".replaced"), "Dear Sir or Madam,\n");
+}
+
+TEST_F(ProjectSaving, KeepsADamagedFileAsBackupWhereThatIsDamagedToo)
+{
+    m_folder.write("film.json.backup", "half a ba");
+    m_folder.write("film.json", "half a pro");
+    SmallProject(3).save(m_path);
+    EXPECT_EQ(contentOf(m_path + ".backup"), "half a pro");
+    EXPECT_EQ(names(), "film.json film.json.backup");
+}
+
 TEST_F(ProjectSaving, KeepsThePermissions)
 {
     for (const mode_t mode : {0600u, 0640u, 0664u, 0777u}) {
