@@ -2,17 +2,15 @@
 // A project of ten thousand clips, with its table of resources and its collection, saved to the disk and
 // opened: by the store of projects, beside a bare archive in memory whose bytes are written and flushed.
 #include "ArchiveRuns.h"
+#include "LongTimeline.h"
 #include "PeakMemory.h"
 #include "Ratio.h"
 
 #include "host/project/ProjectStore.h"
 
-#include <EditorModel/effects/Effect.h>
 #include <EditorModel/library/Import.h>
 #include <EditorModel/library/UserObject.h>
-#include <EditorModel/media/File.h>
 #include <EditorModel/media/ResourceTable.h>
-#include <EditorModel/timeline/Timeline.h>
 
 #include <QTemporaryDir>
 
@@ -21,44 +19,26 @@
 #include <cstdio>
 #include <stdexcept>
 #include <string>
-#include <unordered_set>
 #include <vector>
 
 namespace {
 
 using namespace ArchiveRuns;
+using namespace LongTimelines;
 
-constexpr int clipCount = 10000;
-constexpr int trackCount = 4;
-constexpr int clipsOfAFile = 10;
 constexpr int itemCount = 1000;
 
-/// Each clip has a timing and an effect, shares its file with a few others, and every second one is linked to
-/// its neighbour. Every track of a file is a resource.
+/// Every track of a file is a resource.
 class LongProject
 {
 public:
-    LongProject()
-        : m_clips(clipCount),
-          m_effects(clipCount),
-          m_tracks(trackCount),
-          m_files(clipCount / clipsOfAFile),
-          m_videoTracks(m_files.size()),
-          m_audioTracks(m_files.size()),
-          m_items(itemCount)
+    LongProject() : m_items(itemCount)
     {
-        for (int i = 0; i != trackCount; ++i) {
-            m_tracks[std::size_t(i)].type = static_cast<TrackType>(PrimaryTrack * (i + 1));
-            m_tracks[std::size_t(i)].timeline = &m_timeline;
-            m_timeline.tracks.push_back(&m_tracks[std::size_t(i)]);
-        }
-        for (std::size_t i = 0; i != m_files.size(); ++i)
-            addFile(i);
-        for (int i = 0; i != clipCount; ++i)
-            addClip(i);
+        for (std::size_t i = 0; i != m_timeline.files.size(); ++i)
+            addResources(i);
         for (std::size_t i = 0; i != m_items.size(); ++i)
             addItem(i);
-        content.timeline = &m_timeline;
+        content.timeline = &m_timeline.timeline;
         content.userCollection = &m_collection;
         content.resourceTable = &m_table;
     }
@@ -66,58 +46,14 @@ public:
     Project::Content content;
 
 private:
-    void addFile(std::size_t i)
+    void addResources(std::size_t i)
     {
-        Media::File& file = m_files[i];
-        file.path = QStringLiteral("/films/holiday/file number %1.mov").arg(i);
-        file.size = (qint64(1) << 32) + qint64(i);
-        file.format = "mov";
-        file.length = 60000;
-        file.isOpened = true;
-        m_videoTracks[i].file = &file;
-        m_videoTracks[i].codecId = "h264";
-        m_videoTracks[i].bitrate = 8000000;
-        m_audioTracks[i].file = &file;
-        m_audioTracks[i].index = 1;
-        m_audioTracks[i].codecId = "aac";
-        m_audioTracks[i].bitrate = 128000;
-        file.videoTracks.push_back(&m_videoTracks[i]);
-        file.audioTracks.push_back(&m_audioTracks[i]);
+        const Media::File& file = m_timeline.files[i];
         for (const Resource::Type type : {Resource::VideoType, Resource::AudioType}) {
             Resource::FileInfo& info = m_table.resource2fileInfo[{QString::number(i * 7919, 16), type}].info;
             info.path = file.path;
             info.track = type == Resource::AudioType;
             info.duration = file.length;
-        }
-    }
-
-    void addClip(int i)
-    {
-        Effect::Object& effect = m_effects[std::size_t(i)];
-        effect.id = QStringLiteral("blur");
-        effect.uniqueId = QString::number(i);
-        effect.tag = QStringLiteral("Blur");
-        effect.intensity = 0.25 * i + 0.1;
-
-        Timeline::Clip& clip = m_clips[std::size_t(i)];
-        clip.timeline = &m_timeline;
-        clip.type = static_cast<Timeline::Clip::ClipType>(1 + i % 2);
-        clip.name = QStringLiteral("clip number %1").arg(i);
-        clip.file = &m_files[std::size_t(i / clipsOfAFile)];
-        clip.mediaTrack = i % 2;
-        clip.sourceDuration = 60000;
-        clip.effects.push_back(&effect);
-
-        Timeline::ClipTiming& timing = m_timeline.clips[&clip];
-        timing.track = &m_tracks[std::size_t(i % trackCount)];
-        timing.timestamp = MTime(1000 * (i / trackCount));
-        timing.duration = 1000;
-        timing.sourcePosition = MTime(i);
-        timing.sourceDuration = 60000;
-        if (i % 2 == 1) {
-            Timeline::Link& link = m_timeline.links[&clip];
-            link.master = &m_clips[std::size_t(i - 1)];
-            link.offset = MTime(i);
         }
     }
 
@@ -131,14 +67,8 @@ private:
         m_collection.addItem(&item);
     }
 
-    std::vector<Timeline::Clip> m_clips;
-    std::vector<Effect::Object> m_effects;
-    std::vector<Timeline::Track> m_tracks;
-    std::vector<Media::File> m_files;
-    std::vector<Media::File::Track::Video> m_videoTracks;
-    std::vector<Media::File::Track::Audio> m_audioTracks;
+    LongTimeline<Listed> m_timeline;
     std::vector<Import::Object> m_items;
-    Timeline::Object m_timeline;
     EditorCollection::UserObject m_collection;
     ResourceTable::Object m_table;
 };
@@ -147,27 +77,6 @@ const Project::Content& project()
 {
     static const LongProject longProject;
     return longProject.content;
-}
-
-void freeTimeline(const Timeline::Object* timeline)
-{
-    std::unordered_set<const Media::File*> files;
-    for (const auto& entry : timeline->clips) {
-        files.insert(entry.first->file);
-        for (const auto* const effect : entry.first->effects)
-            delete effect;
-        delete entry.first;
-    }
-    for (const auto* const file : files) {
-        for (const auto* const track : file->videoTracks)
-            delete track;
-        for (const auto* const track : file->audioTracks)
-            delete track;
-        delete file;
-    }
-    for (const auto* const track : timeline->tracks)
-        delete track;
-    delete timeline;
 }
 
 } // namespace
