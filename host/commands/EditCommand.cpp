@@ -7,6 +7,8 @@
 #include "host/project/ProjectDocument.h"
 #include "host/project/ProjectModules.h"
 
+#include <QFileInfo>
+
 namespace Host {
 namespace {
 
@@ -28,7 +30,10 @@ QList<QStringList> commandsOf(const QStringList& words)
 void fill(PackageShelf& shelf, const QStringList& folders)
 {
     for (const QString& folder : folders) {
-        shelf.put(folder);
+        // What is no folder is a fault of its own.
+        if (shelf.put(folder) == 0 && QFileInfo(folder).isDir()) {
+            throw Refusal(folder, "holds no package");
+        }
     }
     const std::deque<PackageFault> faults = shelf.faults();
     if (!faults.empty()) {
@@ -78,13 +83,13 @@ ExitCode editProject(const QString& path, const QStringList& words, const QStrin
     return unlessRefused([&] {
         PackageShelf shelf;
         fill(shelf, packages);
-        const ProjectDocument document = ProjectDocument::load(path);
+        ProjectDocument document = ProjectDocument::load(path);
         ProjectModules modules(contentOf(document));
         EditScript script(modules.session(), modules.places(), &shelf);
         for (const QStringList& command : commandsOf(words)) {
             script.run(command);
         }
-        document.save(path);
+        document.save();
         return Success;
     });
 }

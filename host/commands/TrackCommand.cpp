@@ -62,7 +62,7 @@ ExitCode trackClip(const TrackOptions& options)
 {
     return unlessRefused([&] {
         TrackingStore store;
-        const ProjectDocument document = ProjectDocument::load(options.project);
+        ProjectDocument document = ProjectDocument::load(options.project);
         const Timeline::Object& timeline = document.timeline();
         const Timeline::Clip& clip = clipToTrack(timeline, options.clip);
         const MotionTracking::Data tracking = trackingOf(clip, timeline.clipTiming(&clip), options);
@@ -71,7 +71,7 @@ ExitCode trackClip(const TrackOptions& options)
         }
         store.put(tracking);
         document.writable(clip).addMotionTracking(tracking.id);
-        document.save(options.project);
+        document.save();
         if (!document.project()) {
             store.save(TrackingStore::folderOf(options.project));
         }

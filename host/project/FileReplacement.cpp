@@ -316,6 +316,21 @@ void replaceFile(const QString& path, const std::vector<QByteArray>& parts,
     flushFolder(folderOf(file));
 }
 
+QByteArray versionOf(const QString& path)
+{
+    struct stat status
+    {};
+    if (::stat(QFile::encodeName(path).constData(), &status) != 0) {
+        return {};
+    }
+    QByteArray version;
+    for (const qint64 number : {qint64(status.st_dev), qint64(status.st_ino), qint64(status.st_size),
+                                qint64(status.st_mtim.tv_sec), qint64(status.st_mtim.tv_nsec)}) {
+        version += QByteArray::number(number) + ' ';
+    }
+    return version;
+}
+
 QString siblingOf(const QString& path, const QString& ending)
 {
     return QFile::decodeName(withEnding(followed(path), ending).c_str());

@@ -29,6 +29,10 @@ public:
 void replaceFile(const QString& path, const std::vector<QByteArray>& parts,
                  const std::function<QString()>& ending);
 
+/// Tells the versions of a file apart: after a replacement, or another change, there is another one. Empty
+/// where there is no file.
+QByteArray versionOf(const QString& path);
+
 /// A name beside the file that links lead to: its own with the ending. So replaceFile() names the old file.
 /// Throws ReplacementFailed for links that lead in a circle.
 QString siblingOf(const QString& path, const QString& ending);

@@ -3,6 +3,7 @@
 
 #include "host/commands/Refusal.h"
 #include "host/project/DocumentFile.h"
+#include "host/project/FileReplacement.h"
 #include "host/project/ProjectStore.h"
 
 #include <utility>
@@ -27,10 +28,12 @@ Document::Graph plainDocument(const QString& path)
 
 ProjectDocument ProjectDocument::load(const QString& path)
 {
+    // Before the reading: what comes in between is taken for a change.
+    const QByteArray version = versionOf(path);
     if (ProjectStore::isProject(path)) {
         OpenedProject opened = ProjectStore::open(path);
         Project::Content* const content = &opened.content();
-        return ProjectDocument(path, opened.takeGraph(), content);
+        return ProjectDocument(path, version, opened.takeGraph(), content);
     }
     Document::Graph graph = plainDocument(path);
     if (graph.rootAs<Project::Content>()) {
@@ -38,7 +41,7 @@ ProjectDocument ProjectDocument::load(const QString& path)
         throw Refusal(path, "holds a project without its checksum" +
                                 QString::fromStdString(ProjectStore::backupHint(path)));
     }
-    return ProjectDocument(path, std::move(graph), nullptr);
+    return ProjectDocument(path, version, std::move(graph), nullptr);
 }
 
 Timeline::Object& ProjectDocument::timeline() const
@@ -50,17 +53,21 @@ Timeline::Object& ProjectDocument::timeline() const
     return *timeline;
 }
 
-void ProjectDocument::save(const QString& path) const
+void ProjectDocument::save()
 {
     if (m_project) {
-        ProjectStore::save(*m_project, path);
+        ProjectStore::save(*m_project, m_path, m_version);
+    } else if (versionOf(m_path) == m_version) {
+        saveDocument({m_graph.roots().begin(), m_graph.roots().end()}, m_path);
     } else {
-        saveDocument({m_graph.roots().begin(), m_graph.roots().end()}, path);
+        throw Refusal(m_path, "is not replaced: somebody has changed it since it was read");
     }
+    m_version = versionOf(m_path);
 }
 
-ProjectDocument::ProjectDocument(QString path, Document::Graph graph, Project::Content* project)
-    : m_path(std::move(path)), m_graph(std::move(graph)), m_project(project)
+ProjectDocument::ProjectDocument(QString path, QByteArray version, Document::Graph graph,
+                                 Project::Content* project)
+    : m_path(std::move(path)), m_version(std::move(version)), m_graph(std::move(graph)), m_project(project)
 {}
 
 Timeline::Object* timelineOf(const Document::Graph& graph)

@@ -5,6 +5,7 @@
 #include <EditorModel/persistence/Document.h>
 #include <EditorModel/timeline/Timeline.h>
 
+#include <QByteArray>
 #include <QString>
 
 namespace Host {
@@ -27,14 +28,17 @@ public:
     /// A clip of a timeline in the document, which owns it: nobody else has claimed it constant.
     Timeline::Clip& writable(const Timeline::Clip& clip) const { return const_cast<Timeline::Clip&>(clip); }
 
-    /// As what it was loaded as, with what else it holds. The file is replaced as a whole or not at all; its
-    /// ending tells the form. Throws Refusal for another ending, and Document::Error.
-    void save(const QString& path) const;
+    /// As what it was loaded as, with what else it holds, to where it was loaded from. The file is replaced
+    /// as a whole or not at all, and not where somebody else has changed it meanwhile; its ending tells the
+    /// form. Throws Refusal for another ending, and Document::Error.
+    void save();
 
 private:
-    ProjectDocument(QString path, Document::Graph graph, Project::Content* project);
+    ProjectDocument(QString path, QByteArray version, Document::Graph graph, Project::Content* project);
 
     QString m_path;
+    /// Of the file that was read, or saved here last.
+    QByteArray m_version;
     Document::Graph m_graph;
     Project::Content* m_project;
 };

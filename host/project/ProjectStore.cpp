@@ -90,6 +90,14 @@ bool isWhole(const QString& path)
     }
 }
 
+/// Any if none was read.
+void requireVersion(const QString& path, const QByteArray& read)
+{
+    if (!read.isEmpty() && versionOf(path) != read) {
+        throw ReplacementFailed("is not replaced: somebody has changed it since it was read");
+    }
+}
+
 /// As what the file is kept that a save replaces.
 const char* endingForOld(const QString& path)
 {
@@ -150,13 +158,16 @@ OpenedProject::OpenedProject(Document::Graph graph, Project::Content* content)
     : m_graph(std::move(graph)), m_content(content)
 {}
 
-void ProjectStore::save(const Project::Content& content, const QString& path)
+void ProjectStore::save(const Project::Content& content, const QString& path, const QByteArray& readVersion)
 {
     const Document::Form form = formOf(path);
     try {
         const QByteArray document = documentOf(content, form);
         const ProjectSeal seal = projectSeal(document, form);
-        replaceFile(path, {seal.before, document, seal.behind}, [&path] { return endingForOld(path); });
+        replaceFile(path, {seal.before, document, seal.behind}, [&] {
+            requireVersion(path, readVersion);
+            return endingForOld(path);
+        });
     } catch (const Document::Error& error) {
         refuse(path, error);
     } catch (const ReplacementFailed& error) {

@@ -4,6 +4,7 @@
 #include <EditorModel/library/Project.h>
 #include <EditorModel/persistence/Document.h>
 
+#include <QByteArray>
 #include <QString>
 
 #include <string>
@@ -37,7 +38,11 @@ public:
     /// Replaces the file, and keeps the old one as backup, both whole at every instant; the ending of the
     /// name tells the form. An old file that is no whole project takes no whole backup's place: it is kept
     /// beside it, with the ending ".replaced". Where it fails the old file stands as it was.
-    static void save(const Project::Content& content, const QString& path);
+    ///
+    /// With the version of the file that was read, see versionOf(), no other one is replaced: what somebody
+    /// has saved since then would be lost.
+    static void save(const Project::Content& content, const QString& path,
+                     const QByteArray& readVersion = QByteArray());
 
     /// The file may be anybody's. Where it cannot be read and its backup can, the error says so.
     static OpenedProject open(const QString& path);

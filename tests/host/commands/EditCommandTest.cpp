@@ -392,6 +392,11 @@ TEST(EditCommand, TakesTitlesFromPackagesThatAreSound)
     EXPECT_THAT(outcome.errors,
                 StartsWith(QFileInfo(folder.path()).fileName().toStdString() + ": package.json: "));
     EXPECT_EQ(contentOf(project.path()), before);
+
+    const Folder empty;
+    EXPECT_EQ(editormodel(QStringList{"edit", project.path(), "--packages", empty.path()} + title).errors,
+              empty.path().toStdString() + ": holds no package\n");
+    EXPECT_EQ(contentOf(project.path()), before);
 }
 
 TEST(EditCommand, ListsAddedMediaInTheWholeProject)

@@ -6,6 +6,7 @@
 
 #include "host/media/MediaTable.h"
 #include "host/media/ResourceText.h"
+#include "host/project/ProjectDocument.h"
 #include "host/timeline/TimelineTable.h"
 
 #include <EditorModel/media/File.h>
@@ -119,6 +120,25 @@ TEST_P(ProjectCommands, EditATimelineAndKeepTheRestOfTheProject)
     EXPECT_EQ(ProjectStore::openBackup(path()).content().timeline->clips.size(), 2u);
     EXPECT_EQ(editormodel({"picture", path(), m_folder.path("film.svg")}).errors, "");
     EXPECT_TRUE(contentOf(m_folder.path("film.svg")).contains("nest"));
+}
+
+TEST_P(ProjectCommands, SaveNothingOverWhatAnotherHasSavedMeanwhile)
+{
+    ProjectStore::save(m_project.content, path());
+    Document::saveFile(m_folder.path("plain.json"), {&m_project.outer.timeline}, Document::Json,
+                       Document::Stream);
+    for (const QString& place : {path(), m_folder.path("plain.json")}) {
+        auto slow = Host::ProjectDocument::load(place);
+        auto quick = Host::ProjectDocument::load(place);
+        quick.timeline().removeClip(quick.timeline().clips.begin()->first);
+        quick.save();
+        EXPECT_ANY_THROW(slow.save());
+        EXPECT_EQ(Host::ProjectDocument::load(place).timeline().clips.size(), 1u);
+        // What it has saved itself is no reason.
+        quick.timeline().clearClips();
+        quick.save();
+        EXPECT_EQ(Host::ProjectDocument::load(place).timeline().clips.size(), 0u);
+    }
 }
 
 TEST_P(ProjectCommands, NameTheBackupOfADamagedProjectAndShowIt)

@@ -3,6 +3,7 @@
 #include "tests/host/shared/Child.h"
 #include "tests/host/shared/Samples.h"
 
+#include "host/project/FileReplacement.h"
 #include "host/project/ProjectContexts.h"
 
 #include <EditorModel/bus/PubSub.h>
@@ -114,6 +115,19 @@ TEST_F(ProjectSaving, KeepsADamagedFileAsBackupWhereThatIsDamagedToo)
     SmallProject(3).save(m_path);
     EXPECT_EQ(contentOf(m_path + ".backup"), "half a pro");
     EXPECT_EQ(names(), "film.json film.json.backup");
+}
+
+TEST_F(ProjectSaving, LeavesWhatSomebodyElseHasSavedSinceTheProjectWasRead)
+{
+    const QByteArray read = Host::versionOf(m_path);
+    SmallProject(3).save(m_path);
+    const SmallProject mine(4);
+    EXPECT_THROW(ProjectStore::save(mine.content, m_path, read), Document::Error);
+    EXPECT_EQ(numberIn(m_path), 3);
+    EXPECT_EQ(numberInBackup(m_path), 2);
+    EXPECT_EQ(names(), "film.json film.json.backup");
+    ProjectStore::save(mine.content, m_path, Host::versionOf(m_path));
+    EXPECT_EQ(numberIn(m_path), 4);
 }
 
 TEST_F(ProjectSaving, KeepsThePermissions)
