@@ -165,7 +165,8 @@ void PackageShelf::refresh()
         clear(folder);
     }
     for (const QString& folder : folders) {
-        if (m_folder2slot.count(folder) == 0) {
+        // Whoever hears of one package may have another one taken off.
+        if (m_folder2slot.count(folder) == 0 && m_withheld.count(folder) == 0) {
             shelve(folder);
         }
     }
@@ -311,7 +312,10 @@ void PackageShelf::clear(const QString& folder)
     for (const Import::Object* import : gone.imports) {
         m_importsView->remove(import);
     }
-    uninstall(gone.appId);
+    // Whoever hears of an import may have put the package again.
+    if (!package(gone.appId)) {
+        uninstall(gone.appId);
+    }
 }
 
 void PackageShelf::install(const PackageContent& content)

@@ -359,6 +359,41 @@ TEST_F(Shelf, KeepsWhatIsTakenOffWhileARequestAboutItIsAnswered)
     EXPECT_FALSE(watcher.isObserved(bell));
 }
 
+TEST_F(Shelf, LeavesOffWhatIsTakenOffWhileItsFoldersAreReadAgain)
+{
+    writeEffectPackage(folder.path("a"), "a.warm");
+    writeEffectPackage(folder.path("b"), "b.warm");
+    Host::PackageShelf shelf;
+    shelf.put(folder.path());
+    Client client;
+    client.onCatalogue = [&] { shelf.takeOff("b"); };
+    PackageBuilder(folder.path("a")).writeEffect("warm.json", "Warmer");
+    shelf.refresh();
+    EXPECT_EQ(shelf.find<Effect::Object>("a.warm")->tag, "Warmer");
+    EXPECT_EQ(shelf.package("b"), nullptr);
+    EXPECT_EQ(shelf.catalogue().findPack("b"), nullptr);
+}
+
+TEST_F(Shelf, LeavesThePackOfAPackageThatIsPutAgainWhileItIsTakenOff)
+{
+    writeImportPackage("a");
+    Host::PackageShelf shelf;
+    shelf.put(folder.path());
+    struct Watcher : Message::View<Import::Object>
+    {
+        void removed(const Import::Object*) override { onRemoval(); }
+        std::function<void()> onRemoval;
+    } watcher;
+    watcher.observe(shelf.find<Import::Object>("a.bell"));
+    watcher.onRemoval = [&] { shelf.put(folder.path("a")); };
+    EXPECT_TRUE(shelf.takeOff("a"));
+    const auto* const bell = shelf.find<Import::Object>("a.bell");
+    ASSERT_NE(bell, nullptr);
+    ASSERT_NE(shelf.catalogue().findPack("a"), nullptr);
+    EXPECT_EQ(bell->pack, shelf.catalogue().findPack("a"));
+    EXPECT_TRUE(bell->pack->isInstalled());
+}
+
 TEST_F(Shelf, FreesAllThatItHad)
 {
     writeImportPackage("a");
