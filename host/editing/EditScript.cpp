@@ -5,7 +5,11 @@
 #include "host/editing/EditWords.h"
 #include "host/timeline/TimelineOutline.h"
 
+#include <EditorModel/persistence/Document.h>
+
 #include <algorithm>
+#include <iterator>
+#include <set>
 
 namespace Host {
 namespace {
@@ -16,11 +20,9 @@ using Timeline::Track;
 template <class T>
 void append(std::vector<const T*>& numbered, const std::vector<const T*>& present)
 {
-    for (const T* object : present) {
-        if (std::find(numbered.begin(), numbered.end(), object) == numbered.end()) {
-            numbered.push_back(object);
-        }
-    }
+    const std::set<const T*> known(numbered.begin(), numbered.end());
+    std::copy_if(present.begin(), present.end(), std::back_inserter(numbered),
+                 [&known](const T* object) { return known.count(object) == 0; });
 }
 
 } // namespace
@@ -41,6 +43,8 @@ void EditScript::run(const QStringList& words)
     } catch (const Refusal& refusal) {
         const QString about = refusal.name.isEmpty() ? QString() : refusal.name + ' ';
         throw Refusal(words.join(' '), about + refusal.reason);
+    } catch (const Document::Error& error) {
+        throw Refusal(words.join(' '), QString::fromStdString(error.what()));
     }
     numberTheNew();
 }

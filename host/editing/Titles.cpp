@@ -5,6 +5,7 @@
 #include "host/editing/TimelineInvariants.h"
 #include "host/packages/PackageShelf.h"
 #include "host/project/DocumentFile.h"
+#include "host/project/ProjectStore.h"
 
 #include <QFileInfo>
 
@@ -79,6 +80,9 @@ Title titleOf(const QString& word, const PackageShelf* shelf)
         Overlay::Preset preset;
         preset.appendItem(Overlay::Item().setText(word));
         return {word, preset};
+    }
+    if (ProjectStore::isProject(word)) {
+        throw Refusal(word, "holds no title, but a project");
     }
     const Document::Graph graph = loadDocument(word);
     const auto* const preset = graph.rootAs<Overlay::Preset>();

@@ -9,6 +9,7 @@
 #include "host/media/FileImporter.h"
 #include "host/media/MediaOpener.h"
 #include "host/packages/PackageShelf.h"
+#include "host/project/ProjectStore.h"
 
 #include <EditorModel/effects/Overlay.h>
 #include <EditorModel/persistence/Document.h>
@@ -120,6 +121,11 @@ TEST_F(EditScript, RefusesTitlesThatItCannotLay)
     const QString path = folder.path("file.json");
     Document::saveFile(path, {&file}, Document::Json, Document::Stream);
     EXPECT_EQ(refusalOf({"title", path, "1"}), path.toStdString() + " holds no title, but File");
+    const QString project = folder.path("project.json");
+    Host::ProjectStore::save(Project::Content(), project);
+    EXPECT_EQ(refusalOf({"title", project, "1"}), project.toStdString() + " holds no title, but a project");
+    const QString damaged = folder.write("damaged.json", "{");
+    EXPECT_THAT(refusalOf({"title", damaged, "1"}), StartsWith(damaged.toStdString() + ": "));
     EXPECT_FALSE(now().titleTrack());
 }
 
