@@ -159,7 +159,7 @@ private:
             return;
         case Value::Fields:
         case Value::Sequence:
-            line(place, value.text + " of " + std::to_string(value.parts.size()));
+            line(place, itemsText(value));
             for (std::size_t i = 0; i != value.parts.size(); ++i) {
                 const std::string& key = value.parts[i].first;
                 put(place + "/" + (key.empty() ? std::to_string(i + 1) : key), value.parts[i].second);
@@ -175,10 +175,16 @@ private:
         }
         std::stable_sort(items.begin(), items.end(),
                          [](const auto& a, const auto& b) { return a.first < b.first; });
-        line(place, "of " + std::to_string(items.size()));
+        line(place, itemsText(value));
         for (std::size_t i = 0; i != items.size(); ++i) {
             put(place + "/" + std::to_string(i + 1), *items[i].second);
         }
+    }
+
+    static std::string itemsText(const Value& value)
+    {
+        const std::string what = value.text.empty() ? std::string() : value.text + " of ";
+        return what + std::to_string(value.parts.size()) + (value.parts.size() == 1 ? " item" : " items");
     }
 
     /// In the order of first mention.
@@ -231,7 +237,9 @@ std::optional<std::string> firstDifference(const GraphRecord& a, const GraphReco
         std::getline(linesA, lineA);
         std::getline(linesB, lineB);
     } while (lineA == lineB && (linesA || linesB));
-    return lineA + " against " + lineB;
+    const std::string place = lineA.substr(0, lineA.find(": ") + 2);
+    const bool isOnePlace = lineB.compare(0, place.size(), place) == 0;
+    return lineA + " against " + (isOnePlace ? lineB.substr(place.size()) : lineB);
 }
 
 } // namespace Host

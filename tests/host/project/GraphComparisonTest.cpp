@@ -154,9 +154,20 @@ TEST(GraphComparison, NamesTheFirstDifference)
     const auto difference = firstDifference(recordOf({&a}), recordOf({&b}));
     ASSERT_TRUE(difference);
     EXPECT_THAT(*difference, testing::HasSubstr("volume: 80 against "));
-    EXPECT_THAT(*difference, testing::EndsWith("volume: 100"));
+    EXPECT_THAT(*difference, testing::EndsWith("volume: 80 against 100"));
     EXPECT_TRUE(firstDifference(recordOf({&a}), recordOf({&a, &b})));
     EXPECT_TRUE(firstDifference(recordOf({&a}), recordOf({nullptr})));
+}
+
+TEST(GraphComparison, CountsItemsWhereTheirNumbersDiffer)
+{
+    Timeline::Object a;
+    Timeline::Object b;
+    const Timeline::Track track;
+    a.addTrack(&track);
+    const auto difference = firstDifference(recordOf({&a}), recordOf({&b}));
+    ASSERT_TRUE(difference);
+    EXPECT_THAT(*difference, testing::EndsWith("tracks: 1 item against 0 items"));
 }
 
 TEST(GraphComparison, ALongChainOfObjectsIsRecorded)
