@@ -20,7 +20,8 @@ namespace {
 std::string usageMessage(const CLI::App*, const CLI::Error& error)
 {
     return printable(QString::fromStdString(error.what()).simplified()) +
-           "\nRun with --help for more information; a file name that begins with - goes after --.\n";
+           "\nRun with --help for more information; a file name that begins with - goes after --, or is "
+           "written ./-NAME.\n";
 }
 
 /// An unknown option is the better reason than the file that is missing then.
