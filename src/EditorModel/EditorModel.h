@@ -83,6 +83,7 @@
 #include <EditorModel/services/Report.h>
 #include <EditorModel/services/Statistics.h>
 #include <EditorModel/services/Task.h>
+#include <EditorModel/services/Translator.h>
 #include <EditorModel/services/Tutorial.h>
 #include <EditorModel/timeline/Clip.h>
 #include <EditorModel/timeline/ClipBuildingStrategy.h>
