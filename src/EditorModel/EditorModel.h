@@ -80,6 +80,8 @@
 #include <EditorModel/persistence/streams/Streams.h>
 #include <EditorModel/services/AppEvents.h>
 #include <EditorModel/services/Command.h>
+#include <EditorModel/services/Device.h>
+#include <EditorModel/services/Playback.h>
 #include <EditorModel/services/Report.h>
 #include <EditorModel/services/Statistics.h>
 #include <EditorModel/services/Task.h>
