@@ -79,6 +79,7 @@
 #include <EditorModel/persistence/Type.h>
 #include <EditorModel/persistence/streams/Streams.h>
 #include <EditorModel/services/AppEvents.h>
+#include <EditorModel/services/Capture.h>
 #include <EditorModel/services/Command.h>
 #include <EditorModel/services/Device.h>
 #include <EditorModel/services/Playback.h>
