@@ -54,6 +54,7 @@
 #include <EditorModel/library/PackageStorage.h>
 #include <EditorModel/library/PersistentItem.h>
 #include <EditorModel/library/Project.h>
+#include <EditorModel/library/UserBlob.h>
 #include <EditorModel/library/UserObject.h>
 #include <EditorModel/media/Audio.h>
 #include <EditorModel/media/File.h>
