@@ -8,6 +8,7 @@
 #include <EditorModel/media/FileAnalyzer.h>
 #include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/media/Views.h>
+#include <EditorModel/services/Device.h>
 
 #include <gtest/gtest.h>
 
@@ -34,6 +35,10 @@ using Instances = testing::Types<
     Instance<Transition::Object, Preview::Details::ObjectViewBase<Transition::Object>>,
     Instance<Import::Object, Preview::Details::ObjectViewBase<Import::Object>>,
     Instance<Import::State, Import::Details::StateViewBase, Import::StateView>,
+    Instance<Device::Output<Media::Audio>, Device::OutputViewBase<Media::Audio>,
+             Device::View<Device::Output<Media::Audio>>>,
+    Instance<Device::Output<Media::Video>, Device::OutputViewBase<Media::Video>,
+             Device::View<Device::Output<Media::Video>>>,
     Instance<Media::File, Media::Details::FileViewBase, Media::View<Media::File>>,
     Instance<Media::Audio, Media::Details::AudioViewBase, Media::View<Media::Audio>,
              Media::Details::TAudioViewBase, Media::TView<Media::Audio>>,
