@@ -2,6 +2,7 @@
 // Trackings of all kinds against walks that do the same step by step.
 #include "tests/analysis/Trackings.h"
 
+#include <gtest/gtest.h>
 #include <rapidcheck/gtest.h>
 
 #include <algorithm>
