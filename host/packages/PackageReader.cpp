@@ -75,7 +75,7 @@ public:
             readDescription();
         } catch (const Refusal& refusal) {
             note(refusal);
-            return {nullptr, std::move(m_faults)};
+            return {nullptr, std::move(m_faults), {}};
         }
         const Package::Object& description = *m_content->description;
         readAddOns<Overlay::Preset>(description.overlays);
@@ -84,7 +84,7 @@ public:
         readAddOns<Import::Object>(description.imports);
         readAddOns<Quiz::Preset>(description.quizzes);
         checkFolder(description.fontsDir);
-        return {std::move(m_content), std::move(m_faults)};
+        return {std::move(m_content), std::move(m_faults), std::move(m_takenIds)};
     }
 
 private:
@@ -170,7 +170,7 @@ private:
         m_content->documents.push_back(std::move(graph));
     }
 
-    void requireFreeId(const QString& id, const QString& name) const
+    void requireFreeId(const QString& id, const QString& name)
     {
         if (id.isEmpty()) {
             throw Refusal(name, "has no identifier");
@@ -180,6 +180,7 @@ private:
         }
         const auto other = m_id2package.find(id);
         if (other != m_id2package.end()) {
+            m_takenIds.insert(id);
             throw Refusal(name, "has the identifier of an element of " + other->second + ": " + id);
         }
     }
@@ -252,6 +253,7 @@ private:
     const std::map<QString, QString>& m_id2package;
     std::unique_ptr<PackageContent> m_content;
     std::set<QString> m_ids;
+    std::set<QString> m_takenIds;
     std::deque<PackageFault> m_faults;
 };
 

@@ -8,6 +8,7 @@
 #include <deque>
 #include <map>
 #include <memory>
+#include <set>
 
 namespace Host {
 
@@ -17,6 +18,8 @@ struct PackageReading
     /// Null if the description could not be read. Elements with faults are missing in it.
     std::unique_ptr<PackageContent> content;
     std::deque<PackageFault> faults;
+    /// The identifiers of elements that are missing since elements of other packages have them.
+    std::set<QString> takenIds;
 };
 
 /// Reads the package in a folder.

@@ -164,6 +164,9 @@ void PackageShelf::refresh()
     for (const QString& folder : outdated) {
         clear(folder);
     }
+    for (const QString& folder : completable()) {
+        clear(folder);
+    }
     for (const QString& folder : folders) {
         // Whoever hears of one package may have another one taken off.
         if (m_folder2slot.count(folder) == 0 && m_withheld.count(folder) == 0) {
@@ -263,6 +266,7 @@ void PackageShelf::shelve(const QString& folder)
     Slot& slot = m_folder2slot[folder];
     slot.fingerprint = fingerprintOf(folder);
     slot.faults = std::move(reading.faults);
+    slot.takenIds = std::move(reading.takenIds);
     if (!reading.content) {
         return;
     }
@@ -316,6 +320,20 @@ void PackageShelf::clear(const QString& folder)
     if (!package(gone.appId)) {
         uninstall(gone.appId);
     }
+}
+
+/// The folders of packages that lack elements whose identifiers are free by now.
+std::deque<QString> PackageShelf::completable() const
+{
+    std::deque<QString> folders;
+    for (const auto& [folder, slot] : m_folder2slot) {
+        const bool isAnyFree = std::any_of(slot.takenIds.begin(), slot.takenIds.end(),
+                                           [this](const QString& id) { return m_id2package.count(id) == 0; });
+        if (isAnyFree) {
+            folders.push_back(folder);
+        }
+    }
+    return folders;
 }
 
 void PackageShelf::install(const PackageContent& content)

@@ -45,7 +45,8 @@ public:
     /// no such package.
     bool takeOff(const QString& appId);
     /// Looks at all folders again: packages that have come are shelved, those that are gone are taken off,
-    /// those in whose folders a file has changed are read anew.
+    /// those in whose folders a file has changed are read anew, and so are those that lack elements whose
+    /// identifiers have become free.
     void refresh();
     /// Has the catalogue tell of a pack that may not be installed. Of an `appId` that it has already nothing
     /// is taken over.
@@ -102,6 +103,8 @@ private:
     {
         Fingerprint fingerprint;
         std::deque<PackageFault> faults;
+        /// See PackageReading.
+        std::set<QString> takenIds;
         /// Null if there is none that could be shelved.
         std::unique_ptr<PackageContent> content;
     };
@@ -112,6 +115,7 @@ private:
     void shelve(const QString& folder);
     void takeIn(Slot& slot, std::unique_ptr<PackageContent> content);
     void clear(const QString& folder);
+    std::deque<QString> completable() const;
     void install(const PackageContent& content);
     void uninstall(const QString& appId);
     const Package::InApp::Pack* enter(const Package::InApp::Pack& pack);

@@ -199,6 +199,26 @@ TEST_F(Imports, CanBeGivenUpInEveryStageBeforeTheEnd)
     EXPECT_THAT(fetchedFiles(), ElementsAre("a.wav"));
 }
 
+TEST_F(Imports, CannotBeGivenUpWhileTheOwnerIsGivenTheMedia)
+{
+    offer(1);
+    Host::ImportKeeper keeper(folder.path("media"));
+    Client client;
+    struct Watcher : Message::View<Import::Object>
+    {
+        using Message::View<Import::Object>::changed;
+        void changed(const Import::Object*, const Import::Object*) override { onChange(); }
+        std::function<void()> onChange;
+    } watcher;
+    watcher.observe(&item);
+    watcher.onChange = [&] { client.cancelImport(&item); };
+    client.import(&item);
+    keeper.run();
+    EXPECT_EQ(client.lines.back(), "a fetched 100");
+    EXPECT_EQ(item.location(), folder.path("media/a.wav"));
+    EXPECT_THAT(fetchedFiles(), ElementsAre("a.wav"));
+}
+
 TEST_F(Imports, CanBeGivenUpByAnObserverOfTheProgress)
 {
     offer(4);
@@ -541,6 +561,17 @@ TEST_F(PackImports, LeaveNothingOfAPackThatIsGivenUpOrThatNobodyTakes)
     EXPECT_EQ(heard.back(), "a failed 100 error 6");
     EXPECT_THAT(fetchedFiles(), IsEmpty());
     EXPECT_FALSE(item.pack->isInstalled());
+}
+
+TEST_F(PackImports, FailWhereTheIdentifierIsNoNameOfAFolder)
+{
+    for (const char* const appId : {"", ".", "..", ".hidden", "../outside", "a/b", "/a"}) {
+        const_cast<Package::InApp::Pack*>(item.pack)->appId = appId;
+        EXPECT_EQ(fetch().back(), "a failed 0 error 4") << appId;
+        EXPECT_THAT(fetchedFiles(), IsEmpty()) << appId;
+    }
+    EXPECT_EQ(QDir(folder.path()).entryList(QDir::Dirs | QDir::NoDotAndDotDot),
+              QStringList({"media", "remote"}));
 }
 
 TEST_F(PackImports, FailForPackedFilesAndForFoldersWithLinks)

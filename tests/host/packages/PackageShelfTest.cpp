@@ -167,6 +167,8 @@ TEST_F(Shelf, TakesOffExactlyWhatAPackageBrought)
     EXPECT_EQ(shelf.package("a"), nullptr) << "it stays off";
     shelf.put(folder.path("a"));
     EXPECT_EQ(shelf.find<Effect::Object>("a.warm")->tag, "Warm");
+    shelf.refresh();
+    EXPECT_NE(shelf.package("a"), nullptr);
 }
 
 TEST_F(Shelf, AnswersWhereThePackagesLie)
@@ -197,6 +199,20 @@ TEST_F(Shelf, TellsOfWhatComesAndGoes)
     EXPECT_EQ(shelf.find<Import::Object>("a.bell")->location(), folder.path("a"));
     shelf.takeOff("a");
     EXPECT_EQ(client.lines, Lines({"no import Bell", "catalogue:"}));
+}
+
+TEST_F(Shelf, HasImportsThatDoNotComeWithTheirPackageToo)
+{
+    PackageBuilder package(folder.path("a"));
+    package.writeImport("remote.json", "Remote", QString());
+    package.description.imports = {PackageBuilder::addOn(
+        {{"sample_audio", CollectionID::IMPORTS}}, {PackageBuilder::resource("a.remote", "remote.json")})};
+    package.writeDescription();
+    Host::PackageShelf shelf;
+    const Client client;
+    shelf.put(folder.path());
+    EXPECT_EQ(client.lines, Lines({"catalogue: a", "import Remote of a"}));
+    EXPECT_EQ(shelf.mediaPath(shelf.find<Import::Object>("a.remote")), "");
 }
 
 TEST_F(Shelf, LetsGoOfEverythingWhenItEnds)
@@ -317,6 +333,8 @@ TEST_F(Shelf, KeepsWhatWasThereFirstWhereTwoPackagesHaveOneIdentifier)
     QDir(folder.path("a")).removeRecursively();
     shelf.refresh();
     EXPECT_EQ(shelf.package("same")->folder, folder.path("b"));
+    EXPECT_EQ(shelf.find<Effect::Object>("a.warm"), shelf.package("c")->itemsOf<Effect::Object>()[0]->item);
+    EXPECT_THAT(shelf.faults(), IsEmpty());
 }
 
 TEST_F(Shelf, NamesPlacesThatAreNoFolders)
@@ -366,12 +384,29 @@ TEST_F(Shelf, LeavesOffWhatIsTakenOffWhileItsFoldersAreReadAgain)
     Host::PackageShelf shelf;
     shelf.put(folder.path());
     Client client;
-    client.onCatalogue = [&] { shelf.takeOff("b"); };
+    bool isTakenOff = false;
+    client.onCatalogue = [&] {
+        if (!std::exchange(isTakenOff, true)) {
+            shelf.takeOff("b");
+        }
+    };
     PackageBuilder(folder.path("a")).writeEffect("warm.json", "Warmer");
     shelf.refresh();
     EXPECT_EQ(shelf.find<Effect::Object>("a.warm")->tag, "Warmer");
     EXPECT_EQ(shelf.package("b"), nullptr);
     EXPECT_EQ(shelf.catalogue().findPack("b"), nullptr);
+}
+
+TEST_F(Shelf, BringsNoImportsOfAPackageThatIsTakenOffWhileItComes)
+{
+    writeImportPackage("a");
+    Host::PackageShelf shelf;
+    Client client;
+    client.onCatalogue = [&] { shelf.takeOff("a"); };
+    shelf.put(folder.path());
+    EXPECT_EQ(client.lines, Lines({"catalogue: a", "catalogue:"}));
+    EXPECT_THAT(Message::View<Import::Object>().enumerateAll(), IsEmpty());
+    EXPECT_THAT(shelf.packages(), IsEmpty());
 }
 
 TEST_F(Shelf, LeavesThePackOfAPackageThatIsPutAgainWhileItIsTakenOff)
