@@ -96,17 +96,24 @@ public:
         }
     }
 
-    void findUnlisted(const File& file, const ResourceTable::Object* table)
+    void findUnlisted(const File& file, const std::set<QString>& listed)
     {
-        const auto names = [&](const auto& entry) {
-            return identifier(entry.second.info.path) == identifier(file.path);
-        };
-        const bool isListed =
-            table && std::any_of(table->resource2fileInfo.begin(), table->resource2fileInfo.end(), names);
-        if (!isListed) {
+        if (listed.count(identifier(file.path)) == 0) {
             m_faults.add(UnlistedMedia, fileText(file.path),
                          "The " + fileText(file.path) + " is not in the table of resources.");
         }
+    }
+
+    /// The identifiers of the files that the table, which may be null, has.
+    std::set<QString> listedIn(const ResourceTable::Object* table) const
+    {
+        std::set<QString> listed;
+        if (table) {
+            for (const auto& entry : table->resource2fileInfo) {
+                listed.insert(identifier(entry.second.info.path));
+            }
+        }
+        return listed;
     }
 
     QString identifier(const QString& path) const { return ResourceKeeper::identifier(absolute(path), 0); }
@@ -153,6 +160,7 @@ void findMediaFaults(const std::deque<CheckedTimeline>& timelines, const std::de
     MediaFaults media(folder, faults);
     std::set<const File*> done;
     std::set<QString> played;
+    const std::set<QString> listed = media.listedIn(table);
     for (const CheckedTimeline& timeline : timelines) {
         for (const Clip* const clip : timeline.outline.clips()) {
             if (!clip->file) {
@@ -165,7 +173,7 @@ void findMediaFaults(const std::deque<CheckedTimeline>& timelines, const std::de
             media.findInFile(*clip->file, " of " + timeline.nameOf(clip));
             const bool isNew = played.insert(media.identifier(clip->file->path)).second;
             if (isNew && needsTable) {
-                media.findUnlisted(*clip->file, table);
+                media.findUnlisted(*clip->file, listed);
             }
         }
     }
