@@ -17,13 +17,6 @@ using Timeline::Track;
 
 namespace {
 
-/// Sound that stands alone takes the audio track that is not linked to the picture.
-const Track* trackFor(const Timeline::Object& timeline, TrackType type)
-{
-    const Track* const detached = type == AudioTrack ? timeline.detachedAudioTrack() : nullptr;
-    return detached ? detached : timeline.findFirstTrack(type);
-}
-
 void requireAdded(const QString& path, const FileAdder::Contexts& places)
 {
     const MediaAdding adding = addMedia({path}, places);
@@ -51,25 +44,13 @@ EditResult EditScript::add(const QStringList& words)
 EditResult EditScript::overwrite(const QStringList& words)
 {
     const MTime at = timeAt(words[2]);
-    const Track* const wished = words.size() > 3 ? trackAt(words[3]) : nullptr;
+    const Track* const track = words.size() > 3 ? trackAt(words[3]) : nullptr;
     const int level = words.size() > 4 ? levelAt(words[4]) : 0;
     const MediaClips::Clips clips = m_media.make(words[1]);
     if (m_places.userCollection || m_places.resourceTable) {
         requireAdded(words[1], m_places);
     }
-    const Track* const track = wished ? wished : trackFor(timeline(), clips.track);
-    if (!track) {
-        return lay(m_session, clips, LayingPlace{nullptr, level, at});
-    }
-    Placement placement(clips.clip, track, level);
-    placement.nativeAudio = clips.nativeAudio;
-    if (clips.nativeAudio && !timeline().nativeAudioTrack()) {
-        EditResult added = m_session.addTrack(m_session.makeTrack(NativeAudioTrack));
-        if (!added) {
-            return added;
-        }
-    }
-    return m_session.overwrite(placement, at);
+    return lay(m_session, clips, LayingPlace{track, level, at, true});
 }
 
 EditResult EditScript::title(const QStringList& words)

@@ -2,6 +2,7 @@
 #include "host/editing/Titles.h"
 
 #include "host/commands/Refusal.h"
+#include "host/editing/MissingTracks.h"
 #include "host/editing/TimelineInvariants.h"
 #include "host/packages/PackageShelf.h"
 #include "host/project/DocumentFile.h"
@@ -94,14 +95,12 @@ Title titleOf(const QString& word, const PackageShelf* shelf)
 
 EditResult layTitle(EditSession& session, const Title& title, const TitlePlace& place)
 {
-    const Track* track = place.track ? place.track : session.timeline()->titleTrack();
-    if (!track) {
-        track = session.makeTrack(TitleTrack);
-        EditResult added = session.addTrack(track);
-        if (!added) {
-            return added;
-        }
+    MissingTracks missing(session);
+    EditResult result = place.track ? EditResult() : missing.provide(TitleTrack);
+    if (!result) {
+        return result;
     }
+    const Track* const track = place.track ? place.track : trackFor(*session.timeline(), TitleTrack);
     const MTime length = lengthOf(title.preset, place.length);
     Clip* const clip = session.makeClip(Clip::OverlayClip);
     clip->setName(title.name)->setOverlay(session.makeOverlay(title.preset));
@@ -109,7 +108,11 @@ EditResult layTitle(EditSession& session, const Title& title, const TitlePlace& 
     const bool isInRange = place.at >= MTime() && place.at <= LATEST_TIME && length <= LATEST_TIME;
     const int level =
         isInRange ? freeLevel(*session.timeline(), ClipTiming(track, 0, place.at, length, 0, length)) : 0;
-    return session.overwrite({clip, track, level}, place.at);
+    result = session.overwrite({clip, track, level}, place.at);
+    if (!result) {
+        missing.takeBack();
+    }
+    return result;
 }
 
 } // namespace Host

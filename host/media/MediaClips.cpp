@@ -2,12 +2,10 @@
 #include "host/media/MediaClips.h"
 
 #include "host/commands/Refusal.h"
+#include "host/editing/MissingTracks.h"
 #include "host/media/FileFacts.h"
 
 #include <QFileInfo>
-
-#include <algorithm>
-#include <vector>
 
 namespace Host {
 namespace {
@@ -42,60 +40,15 @@ Parts partsOf(const QString& path, MediaClips::Strategy strategy, Clip::ClipType
     return parts;
 }
 
-/// Sound that stands alone takes the audio track that is not linked to the picture.
-const Track* trackOf(const Timeline::Object& timeline, TrackType type)
-{
-    const Track* const detached = type == AudioTrack ? timeline.detachedAudioTrack() : nullptr;
-    return detached ? detached : timeline.findFirstTrack(type);
-}
-
-/// The tracks that are made for clips.
-class MissingTracks
-{
-public:
-    explicit MissingTracks(EditSession& session) : m_session(session) {}
-
-    EditResult provide(TrackType type)
-    {
-        if (trackOf(*m_session.timeline(), type)) {
-            return {};
-        }
-        const Track* const track = m_session.makeTrack(type);
-        EditResult added = m_session.addTrack(track);
-        if (added) {
-            m_made.push_back(track);
-        }
-        return added;
-    }
-
-    /// Those that others have laid something on by now stay.
-    void takeBack()
-    {
-        for (auto track = m_made.rbegin(); track != m_made.rend(); ++track) {
-            if (!isUsed(*track) && !m_session.removeTrack(*track)) {
-                break;
-            }
-        }
-    }
-
-private:
-    bool isUsed(const Track* track) const
-    {
-        const auto& clips = m_session.timeline()->clips;
-        return std::any_of(clips.begin(), clips.end(),
-                           [track](const auto& entry) { return entry.second.track == track; });
-    }
-
-    EditSession& m_session;
-    std::vector<const Track*> m_made;
-};
-
 EditResult place(EditSession& session, const MediaClips::Clips& clips, const LayingPlace& where)
 {
-    const Track* const track = where.track ? where.track : trackOf(*session.timeline(), clips.track);
+    const Track* const track = where.track ? where.track : trackFor(*session.timeline(), clips.track);
     Placement placement(clips.clip, track, where.level);
     placement.nativeAudio = clips.nativeAudio;
-    return where.at ? session.insert(placement, *where.at) : session.append(placement);
+    if (!where.at) {
+        return session.append(placement);
+    }
+    return where.overwrites ? session.overwrite(placement, *where.at) : session.insert(placement, *where.at);
 }
 
 } // namespace

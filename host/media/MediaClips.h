@@ -64,8 +64,10 @@ struct LayingPlace
     /// Null is the first track of the clips' type, which is made if it is missing.
     const Timeline::Track* track = nullptr;
     int level = 0;
-    /// Later clips make room. None is the end of the lane.
-    std::optional<MTime> at;
+    /// None is the end of the lane.
+    std::optional<MTime> at = {};
+    /// What lies at the time gives way; otherwise later clips make room.
+    bool overwrites = false;
 };
 
 /// Makes the tracks that are missing, that of native audio among them. Where the clips are refused, these go

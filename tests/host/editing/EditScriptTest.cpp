@@ -147,6 +147,17 @@ TEST_F(EditScript, LetsClipsFollowWhatIsTracked)
     EXPECT_THAT(refusalOf({"unfollow", "tag"}), testing::HasSubstr("follows no other clip"));
 }
 
+TEST_F(EditScript, LeavesNoTrackForWhatIsRefused)
+{
+    const std::size_t tracks = now().tracks.size();
+    EXPECT_NE(refusalOf({"title", "text", "-1"}), "");
+    EXPECT_NE(refusalOf({"overwrite", HostTests::sample("film.mp4"), "-1"}), "");
+    EXPECT_NE(refusalOf({"overwrite", HostTests::sample("film.mp4"), "0", "1", "7"}), "");
+    EXPECT_NE(refusalOf({"overwrite", HostTests::sample("speech.wav"), "-1"}), "");
+    EXPECT_NE(refusalOf({"add", HostTests::sample("film.mp4"), "596:31:23"}), "");
+    EXPECT_EQ(now().tracks.size(), tracks);
+}
+
 TEST_F(EditScript, OverwritesWithAFile)
 {
     // Of 2 s, with its sound.
