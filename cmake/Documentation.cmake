@@ -1,5 +1,6 @@
 # SPDX-License-Identifier: Apache-2.0
-# The target `docs`: the interface's reference pages, where Doxygen is installed.
+# The target `docs`: the interface's reference pages, where Doxygen is installed. A test makes them too, and fails if
+# Doxygen has anything to say about them.
 
 find_package(Doxygen QUIET)
 if(DOXYGEN_FOUND)
@@ -8,4 +9,8 @@ if(DOXYGEN_FOUND)
         COMMAND Doxygen::doxygen "${CMAKE_CURRENT_BINARY_DIR}/Doxyfile"
         COMMENT "Writing the reference pages to ${CMAKE_CURRENT_BINARY_DIR}/docs/html"
         VERBATIM)
+    if(EDITORMODEL_BUILD_TESTS)
+        add_test(NAME House.ReferencePagesAreMadeWithoutWarnings
+            COMMAND Doxygen::doxygen "${CMAKE_CURRENT_BINARY_DIR}/Doxyfile")
+    endif()
 endif()
