@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "Command.h"
+#include "FilmProject.h"
 #include "tests/host/shared/Samples.h"
 
 #include "host/project/ProjectDocument.h"
@@ -22,7 +22,6 @@ namespace {
 
 using namespace HostTests;
 using Host::ProjectDocument;
-using Host::TimelineOutline;
 using testing::AllOf;
 using testing::EndsWith;
 using testing::HasSubstr;
@@ -31,131 +30,9 @@ using testing::StartsWith;
 using Timeline::Clip;
 using Timeline::ClipTiming;
 
-/// A project of a film of 2 s with its sound, a picture, a longer film with its sound, which begins at 6 s
-/// and lasts 4 s, and speech of 1.5 s. The clips have the numbers 1 to 3, their sounds 4 and 5, the speech 6.
-class Project
-{
-public:
-    Project()
-    {
-        const Outcome made = editormodel(
-            {"new", path(), "--media", "film.mp4", "picture.png", "long.mkv", "speech.wav"}, sample(""));
-        EXPECT_EQ(made.exitCode, 0);
-        EXPECT_THAT(made.errors, IsEmpty());
-        EXPECT_THAT(made.output, IsEmpty());
-    }
-
-    QString path() const { return m_folder.path("film.json"); }
-
-    Outcome edit(const QString& words) const
-    {
-        return editormodel(QStringList({"edit", path()}) + words.split(' '), sample(""));
-    }
-
-    /// The edit must succeed.
-    ProjectDocument edited(const QString& words) const
-    {
-        const Outcome outcome = edit(words);
-        EXPECT_EQ(outcome.exitCode, 0) << words.toStdString();
-        EXPECT_THAT(outcome.errors, IsEmpty());
-        EXPECT_THAT(outcome.output, IsEmpty());
-        return ProjectDocument::load(path());
-    }
-
-private:
-    const Folder m_folder;
-};
-
-const Clip* clipAt(const ProjectDocument& document, int number)
-{
-    return TimelineOutline(document.timeline()).clips().at(static_cast<std::size_t>(number) - 1);
-}
-
-const ClipTiming& timingAt(const ProjectDocument& document, int number)
-{
-    return document.timeline().clipTiming(clipAt(document, number));
-}
-
-TEST(NewCommand, LaysMediaOneAfterAnother)
-{
-    const Project project;
-    const ProjectDocument document = ProjectDocument::load(project.path());
-    const Timeline::Object& timeline = document.timeline();
-    const TimelineOutline outline(timeline);
-    ASSERT_EQ(outline.clips().size(), 6u);
-    const std::tuple<const char*, Clip::ClipType, TrackType, qint64, qint64> expected[] = {
-        {"film.mp4", Clip::VideoClip, PrimaryTrack, 0, 2000},
-        {"picture.png", Clip::VideoClip, PrimaryTrack, 2000, 4000},
-        {"long.mkv", Clip::VideoClip, PrimaryTrack, 6000, 4000},
-        {"film.mp4", Clip::AudioClip, NativeAudioTrack, 0, 2000},
-        {"long.mkv", Clip::AudioClip, NativeAudioTrack, 6000, 4000},
-        {"speech.wav", Clip::AudioClip, AudioTrack, 0, 1500},
-    };
-    for (std::size_t i = 0; i != outline.clips().size(); ++i) {
-        const auto& [name, type, track, start, length] = expected[i];
-        const Clip* const clip = outline.clips()[i];
-        const ClipTiming& timing = timeline.clipTiming(clip);
-        EXPECT_EQ(clip->name, name);
-        EXPECT_EQ(clip->type, type);
-        EXPECT_EQ(clip->timeline, &timeline);
-        EXPECT_EQ(clip->sourceDuration, MTime(length));
-        EXPECT_EQ(QFileInfo(clip->file->path), QFileInfo(sample(name)));
-        EXPECT_TRUE(QFileInfo(clip->file->path).isAbsolute());
-        EXPECT_EQ(timing.track->type, track);
-        EXPECT_EQ(timing.timestamp, MTime(start)) << name;
-        EXPECT_EQ(timing.duration, MTime(length)) << name;
-    }
-    EXPECT_EQ(timeline.masterOf(clipAt(document, 4)), clipAt(document, 1));
-    EXPECT_EQ(timeline.masterOf(clipAt(document, 5)), clipAt(document, 3));
-    EXPECT_EQ(clipAt(document, 4)->mediaTrack, 1);
-    EXPECT_EQ(timeline.links.size(), 2u);
-    for (const Timeline::Track* track : timeline.tracks) {
-        EXPECT_EQ(track->timeline, &timeline);
-    }
-}
-
-TEST(NewCommand, TakesCoverArtForNoPicture)
-{
-    const Folder folder;
-    ASSERT_EQ(editormodel({"new", folder.path("a.xml"), "--media", sample("song.mp3")}).exitCode, 0);
-    const ProjectDocument document = ProjectDocument::load(folder.path("a.xml"));
-    ASSERT_EQ(document.timeline().clips.size(), 1u);
-    EXPECT_EQ(clipAt(document, 1)->type, Clip::AudioClip);
-    EXPECT_EQ(timingAt(document, 1).track->type, AudioTrack);
-}
-
-TEST(NewCommand, TellsOfEachFileThatItCannotTakeAndMakesNoProjectThen)
-{
-    const Folder folder;
-    folder.copy("film.mp4", "cut.mp4", 0.5);
-    folder.copy("speech.wav", "good.wav");
-    const Outcome outcome =
-        editormodel({"new", "a.bin", "--media", "good.wav", "missing.mp4", "cut.mp4", "."}, folder.path());
-    EXPECT_EQ(outcome.exitCode, 1);
-    EXPECT_EQ(outcome.errors, "missing.mp4: does not exist\n"
-                              "cut.mp4: looks like QuickTime / MOV but is damaged or incomplete\n"
-                              ".: is a folder\n");
-    EXPECT_FALSE(QFile::exists(folder.path("a.bin")));
-}
-
-TEST(NewCommand, ReplacesNoFile)
-{
-    const Folder folder;
-    folder.write("a.json", "precious");
-    const Outcome outcome = editormodel({"new", "a.json", "--media", sample("speech.wav")}, folder.path());
-    EXPECT_EQ(outcome.exitCode, 1);
-    EXPECT_EQ(outcome.errors, "a.json: exists already\n");
-    EXPECT_EQ(contentOf(folder.path("a.json")), "precious");
-    EXPECT_EQ(editormodel({"new", "a.doc", "--media", sample("speech.wav")}).exitCode, 2);
-    EXPECT_EQ(editormodel({"new", "b.json"}).exitCode, 2);
-    const Outcome unwritten = editormodel({"new", "/no/such/folder/a.json", "--media", sample("speech.wav")});
-    EXPECT_EQ(unwritten.exitCode, 1);
-    EXPECT_THAT(unwritten.errors, HasSubstr("/no/such/folder/a.json"));
-}
-
 TEST(EditCommand, AddsFiles)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument appended = project.edited("add speech.wav");
     EXPECT_EQ(timingAt(appended, 7).timestamp, MTime(1500));
     // The clips behind make room, with their sound.
@@ -169,7 +46,7 @@ TEST(EditCommand, AddsFiles)
 
 TEST(EditCommand, MovesClips)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument moved = project.edited("move long.mkv 7.5");
     EXPECT_EQ(timingAt(moved, 3).timestamp, MTime(7500));
     EXPECT_EQ(timingAt(moved, 5).timestamp, MTime(7500));
@@ -180,7 +57,7 @@ TEST(EditCommand, MovesClips)
 
 TEST(EditCommand, TrimsClipsToATime)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument right = project.edited("trim-right film.mp4 1.25");
     EXPECT_EQ(timingAt(right, 1).duration, MTime(1250));
     EXPECT_EQ(timingAt(right, 4).duration, MTime(1250));
@@ -196,7 +73,7 @@ TEST(EditCommand, TrimsClipsToATime)
 
 TEST(EditCommand, SplitsClips)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument document = project.edited("split long.mkv 7.5");
     ASSERT_EQ(document.timeline().clips.size(), 8u);
     EXPECT_EQ(timingAt(document, 3).end(), MTime(7500));
@@ -208,7 +85,7 @@ TEST(EditCommand, SplitsClips)
 
 TEST(EditCommand, ChangesSpeedAndDirection)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument document = project.edited("speed 3 2 then reverse 3");
     EXPECT_EQ(timingAt(document, 3).duration, MTime(2000));
     EXPECT_TRUE(timingAt(document, 3).reversed);
@@ -217,7 +94,7 @@ TEST(EditCommand, ChangesSpeedAndDirection)
 
 TEST(EditCommand, SetsFades)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument document = project.edited("fade-in speech.wav 0.5 , fade-out speech.wav 250ms");
     EXPECT_EQ(timingAt(document, 6).fadeInDuration, MTime(500));
     EXPECT_EQ(timingAt(document, 6).fadeOutDuration, MTime(250));
@@ -225,7 +102,7 @@ TEST(EditCommand, SetsFades)
 
 TEST(EditCommand, AddsAndRemovesTransitions)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument between = project.edited("transition add 1 2 1 wipe");
     const Transition::Object* const wipe =
         between.timeline().transitionOf(clipAt(between, 1), clipAt(between, 2));
@@ -245,7 +122,7 @@ TEST(EditCommand, AddsAndRemovesTransitions)
 
 TEST(EditCommand, AddsMovesAndRemovesTracks)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument added = project.edited("track add audio then track add extra-video");
     ASSERT_EQ(added.timeline().tracks.size(), 5u);
     EXPECT_EQ(added.timeline().tracks[3]->type, AudioTrack);
@@ -260,7 +137,7 @@ TEST(EditCommand, AddsMovesAndRemovesTracks)
 
 TEST(EditCommand, LinksAndUnlinksClips)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument linked = project.edited("link 3 6");
     EXPECT_EQ(linked.timeline().masterOf(clipAt(linked, 6)), clipAt(linked, 3));
     const ProjectDocument unlinked = project.edited("unlink 6");
@@ -269,7 +146,7 @@ TEST(EditCommand, LinksAndUnlinksClips)
 
 TEST(EditCommand, DeletesClips)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument lifted = project.edited("delete film.mp4");
     ASSERT_EQ(lifted.timeline().clips.size(), 4u);
     EXPECT_EQ(timingAt(lifted, 1).timestamp, MTime(2000));
@@ -280,7 +157,7 @@ TEST(EditCommand, DeletesClips)
 
 TEST(EditCommand, NumbersWhatItMakesBehindWhatTheDocumentHad)
 {
-    const Project project;
+    const FilmProject project;
     // The right part and its sound are 7 and 8; the numbers of the others stay.
     const ProjectDocument document = project.edited("split 3 8 then delete 1 then delete 7 then fade-in 6 1");
     EXPECT_EQ(document.timeline().clips.size(), 4u);
@@ -289,7 +166,7 @@ TEST(EditCommand, NumbersWhatItMakesBehindWhatTheDocumentHad)
 
 TEST(EditCommand, RefusesInOneLineAndLeavesTheDocumentAsItIs)
 {
-    const Project project;
+    const FilmProject project;
     const QByteArray before = contentOf(project.path());
     const std::pair<const char*, const char*> wrong[] = {
         {"split 3 5", "split 3 5: "},
@@ -354,7 +231,7 @@ TEST(EditCommand, TellsInOneLineThatThereIsNoTimeline)
 
 TEST(EditCommand, KeepsWhatElseTheDocumentHolds)
 {
-    const Project project;
+    const FilmProject project;
     const Folder folder;
     Media::File file;
     file.setPath("other.wav");
@@ -371,7 +248,7 @@ TEST(EditCommand, KeepsWhatElseTheDocumentHolds)
 
 TEST(EditCommand, TakesTitlesFromPackagesThatAreSound)
 {
-    const Project project;
+    const FilmProject project;
     const QString starter = QString(HOST_PACKAGES "/starter");
     const QStringList title = {"title", "starter.opening-title=The film", "0.5", "1"};
     const QStringList edit = {"edit", project.path(), "--packages", starter};
@@ -401,7 +278,7 @@ TEST(EditCommand, TakesTitlesFromPackagesThatAreSound)
 
 TEST(EditCommand, ListsAddedMediaInTheWholeProject)
 {
-    const Project project;
+    const FilmProject project;
     const ProjectDocument document = project.edited("add picture.jpg");
     std::vector<QString> items;
     for (const Import::Object* item : document.project()->userCollection->items) {

@@ -207,6 +207,14 @@ TEST_P(ProjectFiles, AreNothingWithoutTheirSeal)
                                        : HasSubstr("holds a project without its checksum"));
 }
 
+TEST(ProjectFile, IsNoXmlArchiveOfAProject)
+{
+    const QByteArray archive = "<?xml version=\"1.0\"?>\n<!DOCTYPE boost_serialization>\n"
+                               "<content class=\"Project::Content\">";
+    EXPECT_FALSE(Host::isProjectFile(archive, archive));
+    EXPECT_TRUE(Host::isProjectFile(QByteArray(archive).replace("DOCTYPE", "OTHER"), archive));
+}
+
 TEST(ProjectFile, IsJsonAndXmlForOtherPrograms)
 {
     const Folder folder;
