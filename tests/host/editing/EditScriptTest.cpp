@@ -5,6 +5,7 @@
 
 #include "host/commands/Refusal.h"
 #include "host/editing/EditScript.h"
+#include "host/editing/MissingTracks.h"
 #include "host/media/CollectionKeeper.h"
 #include "host/media/FileImporter.h"
 #include "host/media/MediaOpener.h"
@@ -156,6 +157,20 @@ TEST_F(EditScript, LeavesNoTrackForWhatIsRefused)
     EXPECT_NE(refusalOf({"overwrite", HostTests::sample("speech.wav"), "-1"}), "");
     EXPECT_NE(refusalOf({"add", HostTests::sample("film.mp4"), "596:31:23"}), "");
     EXPECT_EQ(now().tracks.size(), tracks);
+}
+
+TEST_F(EditScript, KeepsATrackThatWasMadeForClipsWhereSomethingLiesOnItByNow)
+{
+    Host::MissingTracks missing(session);
+    EXPECT_TRUE(missing.provide(PrimaryTrack)) << "it is there";
+    EXPECT_TRUE(missing.provide(ExtraVideoTrack));
+    EXPECT_TRUE(missing.provide(TitleTrack));
+    const Track* const extra = now().extraVideoTrack();
+    Clip* const clip = session.makeClip(Clip::VideoClip);
+    clip->setSourceDuration(1000);
+    EXPECT_TRUE(session.append({clip, extra}));
+    missing.takeBack();
+    EXPECT_THAT(now().tracks, testing::ElementsAre(primary, extra));
 }
 
 TEST_F(EditScript, OverwritesWithAFile)

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/shared/LiveAllocations.h"
 
+#include "tests/host/shared/Samples.h"
+
 #include "host/media/CollectionKeeper.h"
 
 #include <EditorModel/library/CollectionIds.h>
@@ -146,6 +148,21 @@ TEST(CollectionKeeper, ListsAFileOnceOnWhateverWayToIt)
     request({&relative, &absolute, &roundabout});
     ASSERT_THAT(keeper.collection()->items, SizeIs(2));
     EXPECT_EQ(keeper.collection()->items[1]->location(), QDir::currentPath() + "/c.wav");
+}
+
+TEST(CollectionKeeper, LeavesTheFolderOfALinkWhereTheLinkLeadsTo)
+{
+    const HostTests::Folder folder;
+    ASSERT_TRUE(QDir(folder.path()).mkpath("there/inner"));
+    ASSERT_TRUE(QDir(folder.path()).mkpath("here"));
+    ASSERT_TRUE(QFile::link(folder.path("there/inner"), folder.path("here/link")));
+    const Keeper keeper;
+    const File above(folder.path("here/link/../a.wav"));
+    const File below(folder.path("here/link/b.wav"));
+    request({&above, &below});
+    ASSERT_THAT(keeper.collection()->items, SizeIs(2));
+    EXPECT_EQ(keeper.collection()->items[0]->location(), folder.path("there/a.wav"));
+    EXPECT_EQ(keeper.collection()->items[1]->location(), folder.path("here/link/b.wav"));
 }
 
 TEST(CollectionKeeper, GoesByTheItemsThatStandInACollectionItIsGiven)

@@ -31,6 +31,27 @@ TEST_F(FileImporterTimeline, LaysTheSoundOfAVideoOnItsOwnTrackWhereverTheVideoGo
     EXPECT_EQ(textOf(*now()), "extra: film.mp4 0-2000 @0; native: film.mp4 0-2000 @0");
 }
 
+TEST_F(FileImporterTimeline, InsertsFilesOfAllKindsOneAfterAnotherOnATrackThatIsGiven)
+{
+    // It takes anything.
+    const Track* const track = addTrack(TrackType());
+    EXPECT_EQ(lay({png, wav, png}, TimelineContext(now(), track, 0, 1000)), Importer::AllAdded);
+    EXPECT_EQ(EditTests::row(*now(), track),
+              "picture.png 1000-5000 @0, speech.wav 5000-6500 @0, picture.png 6500-10500 @0");
+}
+
+TEST_F(FileImporterTimeline, GoesOnWhereAnObserverRemovesTheClipAtOnce)
+{
+    timelines.onChanged = [this] {
+        if (!now()->clips.empty()) {
+            timelines.onChanged = nullptr;
+            EXPECT_TRUE(session.lift(now()->clips.begin()->first));
+        }
+    };
+    EXPECT_EQ(lay({png, wav}, TimelineContext(now(), nullptr, 0, 1000)), Importer::AllAdded);
+    EXPECT_EQ(textOf(*now()), "primary:; audio: speech.wav 1000-2500 @0");
+}
+
 TEST_F(FileImporterTimeline, InsertsAtAPositionOneAfterAnotherOnEachTrack)
 {
     lay({png, wav}, TimelineContext(now()));
