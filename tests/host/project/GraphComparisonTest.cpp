@@ -159,6 +159,21 @@ TEST(GraphComparison, NamesTheFirstDifference)
     EXPECT_TRUE(firstDifference(recordOf({&a}), recordOf({nullptr})));
 }
 
+TEST(GraphComparison, LabelsHaveNoOrder)
+{
+    // In a set they lie in the order of their addresses.
+    Timeline::Label labels[3];
+    labels[0].name = labels[2].name = "in";
+    labels[1].name = "out";
+    Clip a;
+    a.labels = {&labels[0], &labels[1]};
+    Clip b;
+    b.labels = {&labels[1], &labels[2]};
+    EXPECT_EQ(textOf(a), textOf(b));
+    labels[2].name = "later";
+    EXPECT_NE(textOf(a), textOf(b));
+}
+
 TEST(GraphComparison, CountsItemsWhereTheirNumbersDiffer)
 {
     Timeline::Object a;

@@ -179,6 +179,8 @@ const std::vector<Damage>& damages()
         {ValueOutOfRange, "AVolumeIsNegative", [](SoundProject& p) { p.a.setVolume(-1); }},
         {ValueOutOfRange, "APoseIsMoreThanOpaque",
          [](SoundProject& p) { p.pose.keyValues.front().value.setOpacity(101); }},
+        {ValueOutOfRange, "AGainIsNegative",
+         [](SoundProject& p) { p.gain.keyValues.front().value = -0.5; }},
         {ValueOutOfRange, "AGainIsInfinite",
          [](SoundProject& p) { p.gain.keyValues.front().value = infinity; }},
         {ValueOutOfRange, "AKeyIsInfinitelyFar",
