@@ -4,6 +4,8 @@
 
 find_package(Doxygen QUIET)
 if(DOXYGEN_FOUND)
+    get_target_property(public_headers EditorModel HEADER_SET)
+    list(JOIN public_headers "\" \"" documented_headers)
     configure_file(docs/Doxyfile.in Doxyfile @ONLY)
     add_custom_target(docs
         COMMAND Doxygen::doxygen "${CMAKE_CURRENT_BINARY_DIR}/Doxyfile"

@@ -46,7 +46,7 @@ class EDITORMODEL_EXPORT Object : public virtual PubSub::Object
 public:
     QString path;
     MTime sourceDuration;
-    double detectionLevel = 20.0;
+    double detectionLevel = 20.0; ///< the unit is a matter of the analysing module
     /// The limits of a scene's length.
     MTime minDuration;
     MTime maxDuration;

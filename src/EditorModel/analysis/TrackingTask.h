@@ -23,7 +23,7 @@ public:
     /// Where the object is at `initialPosition`.
     MotionTracking::Frame initialFrame;
     MTime initialPosition;
-    Types::Range analyzingRange;
+    Types::Range analyzingRange; ///< in the time of the resource, as the position; its end is inside
     MotionTracking::Algorithm algorithm = DefaultAlgorithm;
 
     AnalyzeTask& setResource(const ResourceRef& newResource);

@@ -9,7 +9,7 @@
 
 namespace VUMeter {
 
-/// The present levels of a source of sound.
+/// The present levels of a source of sound. They are 0 dB until somebody has measured them.
 class EDITORMODEL_EXPORT Object : public virtual PubSub::Object
 {
 public:

@@ -42,8 +42,8 @@ public:
     /// Null for a type that is neither of the two.
     static const QString* mimeType(Type type);
 
-    QString id;
-    QString uniqueId;
+    QString id;       ///< of the effect, as the engine knows it
+    QString uniqueId; ///< of this use of the effect
     /// The name in the library.
     QString tag;
     QString description;

@@ -16,7 +16,7 @@
 
 namespace Overlay {
 
-/// The shadow of an overlay's item: off by default, on where a colour is given.
+/// The shadow of an overlay's item, in the item's units: off by default, on where a colour is given.
 class EDITORMODEL_EXPORT DropShadow : public Serialize::ISerializable
 {
     EDITORMODEL_PERSISTENT(DropShadow)
@@ -35,7 +35,7 @@ public:
     DropShadow(unsigned color_, int offsetX_, int offsetY_, int blurRadius_);
 };
 
-/// One text or shape of an overlay.
+/// One text or shape of an overlay. The units of its times and lengths are the rendering module's.
 class EDITORMODEL_EXPORT Item : public Serialize::ISerializable, public virtual PubSub::Object
 {
     EDITORMODEL_PERSISTENT(Item)

@@ -32,7 +32,7 @@ public:
     ::Resource::Timing timing;
 };
 
-/// What a package adds to the collections of one kind.
+/// What a package adds to the collections of one kind. Whoever reads it knows from where its paths go.
 class EDITORMODEL_EXPORT CollectionAddOn : public Serialize::ISerializable
 {
     EDITORMODEL_PERSISTENT(CollectionAddOn)

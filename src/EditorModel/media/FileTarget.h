@@ -13,8 +13,8 @@ class EDITORMODEL_EXPORT FileTarget : public Media::Object
 {
 public:
     QString path;
-    int videoTrack = 0;
-    int audioTrack = 0;
+    int videoTrack = 0; ///< the number of the track within the file
+    int audioTrack = 0; ///< the number of the track within the file
 
     FileTarget() = default;
     FileTarget(const FileTarget&) = default;

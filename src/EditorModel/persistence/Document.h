@@ -76,7 +76,7 @@ public:
     };
 
     Graph();
-    Graph(std::deque<Serialize::ISerializable*> roots, std::vector<Owned> objects);
+    Graph(std::deque<Serialize::ISerializable*> roots, std::vector<Owned> objects); ///< takes both over
     Graph(Graph&& other) noexcept;
     Graph& operator=(Graph&& other) noexcept;
     ~Graph();

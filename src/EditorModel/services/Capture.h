@@ -77,7 +77,7 @@ public:
     Audio* setMode(Mode value);
 
     Quality quality = DefaultQuality;
-    int volume = 100;
+    int volume = 100; ///< the unit is a matter of the recorder
     Mode mode = DefaultMode;
 };
 

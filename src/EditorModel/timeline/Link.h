@@ -17,7 +17,7 @@ struct EDITORMODEL_EXPORT Link : public virtual Serialize::ISerializable
 public:
     /// Not owned.
     const Timeline::Clip* master = nullptr;
-    MTime offset;
+    MTime offset; ///< from the start of the master to that of the slave, in the time of the timeline
 
     /// No link yet, for one that is read.
     Link() = default;

@@ -17,7 +17,7 @@ public:
     /// 10^(level / 20), the ratio of amplitudes: 1 at 0 dB.
     double toRelativeLevel() const;
 
-    constexpr double level() const { return m_level; }
+    constexpr double level() const { return m_level; } ///< in dB
 
     constexpr Decibel& operator+=(Decibel other)
     {
