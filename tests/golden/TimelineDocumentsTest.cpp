@@ -28,8 +28,7 @@ using Testing::Dump;
 const std::string begin = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
 <!DOCTYPE boost_serialization>
 <boost_serialization signature="serialization::archive" version="18">
-<content class_id="0" tracking_level="1" version="0" object_id="_0">
-)";
+<content class_id="0" tracking_level="1" version="0" object_id="_0">)";
 
 const std::string end = R"(</content>
 </boost_serialization>
@@ -38,8 +37,8 @@ const std::string end = R"(</content>
 
 // Numbers of classes that a document leaves out went to the classes of null pointers.
 
-const std::string timelineXml =
-    begin + R"(	<Video class_id="1" tracking_level="1" version="0" object_id="_1">
+const std::string timelineXml = begin + R"(
+	<Video class_id="1" tracking_level="1" version="0" object_id="_1">
 		<width>640</width>
 		<height>360</height>
 		<frameRateN>24000</frameRateN>
@@ -295,7 +294,8 @@ constexpr const char* timelineJson = R"({"content": {
             "resources": {"count": 0, "item_version": 0}, "defaultDuration": 2000, "volume": 100},
          "second": {"first": {"$meta": {"class": "Timeline::Clip", "ref": 5}}, "second": null}}]}}})";
 
-const std::string clipXml = begin + R"(	<timeline class_id="-1"></timeline>
+const std::string clipXml = begin + R"(
+	<timeline class_id="-1"></timeline>
 	<type>8</type>
 	<name>Clip</name>
 	<enabled>1</enabled>
