@@ -16,6 +16,7 @@ void addPicture(CommandLine& line);
 void addCheck(CommandLine& line);
 void addConvert(CommandLine& line);
 void addCompare(CommandLine& line);
+void addPlay(CommandLine& line);
 
 void addNew(CommandLine& line);
 void addEdit(CommandLine& line);

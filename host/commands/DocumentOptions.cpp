@@ -5,13 +5,25 @@
 #include "host/commands/CompareCommand.h"
 #include "host/commands/ConvertCommand.h"
 #include "host/commands/PictureCommand.h"
+#include "host/commands/PlayCommand.h"
 #include "host/commands/ShowCommand.h"
 #include "host/media/MediaProbe.h"
 #include "host/project/FaultList.h"
+#include "host/text/TimeText.h"
 
 #include <memory>
+#include <optional>
 
 namespace Host {
+namespace {
+
+std::string checkStep(const std::string& text)
+{
+    const std::optional<MTime> step = timeOfText(fileName(text));
+    return step && *step > MTime() ? std::string() : "a step is a time of more than zero, as in 0.25 or 40ms";
+}
+
+} // namespace
 
 void addShow(CommandLine& line)
 {
@@ -109,6 +121,42 @@ void addCompare(CommandLine& line)
     command.add_option("OTHER", arguments->others, "What is compared with it")->required()->type_name("");
     command.footer(
         "The command ends with 0 if all are the same, 1 if one differs, 2 if one can't be read.\n");
+    line.needPictures(command);
+}
+
+void addPlay(CommandLine& line)
+{
+    struct Arguments
+    {
+        std::string project;
+        std::string step = "40ms";
+        int volume = 100;
+        bool isDry = false;
+    };
+    const auto arguments = std::make_shared<Arguments>();
+    CLI::App& command = line.add("play", "Play the timeline of a project to a level meter", [arguments] {
+        showMediaLibraryLog(false);
+        PlayOptions options;
+        options.project = fileName(arguments->project);
+        options.step = *timeOfText(fileName(arguments->step));
+        options.volume = arguments->volume;
+        options.pace = arguments->isDry ? Player::Dry : Player::RealTime;
+        return play(options);
+    });
+    command.add_option("PROJECT", arguments->project, "A document with a timeline")
+        ->required()
+        ->type_name("");
+    command.add_option("--step", arguments->step, "The time from one level to the next")
+        ->type_name("TIME")
+        ->check(CLI::Validator(checkStep, ""))
+        ->capture_default_str();
+    command.add_option("--volume", arguments->volume, "Of the output, in percent")
+        ->type_name("PERCENT")
+        ->check(CLI::Range(0, 1000).description(""))
+        ->capture_default_str();
+    command.add_flag("--dry", arguments->isDry, "Don't wait from one step to the next");
+    command.footer("Nothing is decoded: each sound is taken to be at full scale, so that the levels are those "
+                   "which volumes, envelopes and fades make of it.\n");
     line.needPictures(command);
 }
 

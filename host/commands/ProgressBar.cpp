@@ -7,19 +7,10 @@
 
 #include <algorithm>
 
-#include <sys/ioctl.h>
-#include <unistd.h>
-
 namespace Host {
 namespace {
 
 constexpr int barWidth = 20;
-
-int columnsOf(std::FILE* terminal)
-{
-    winsize size = {};
-    return ioctl(fileno(terminal), TIOCGWINSZ, &size) == 0 && size.ws_col > 0 ? size.ws_col : 80;
-}
 
 } // namespace
 
@@ -36,41 +27,26 @@ std::string progressLine(const Report::Progress& progress, int width)
     return room > 0 ? bar + elided(progress.label, room) : elided(QString::fromStdString(bar), width);
 }
 
-ProgressBar::ProgressBar(const Report::Progress* progress, std::FILE* stream)
-    : m_stream(stream), m_isTerminal(isatty(fileno(stream)) == 1)
+ProgressBar::ProgressBar(const Report::Progress* progress, std::FILE* stream) : m_line(stream)
 {
     observe(progress);
 }
 
 ProgressBar::~ProgressBar()
 {
-    wipe();
+    m_line.wipe();
 }
 
 void ProgressBar::changed(const Report::Progress* progress)
 {
-    if (!m_isTerminal) {
-        return;
+    if (m_line.isTerminal()) {
+        m_line.draw(progressLine(*progress, m_line.width()));
     }
-    wipe();
-    // The last column stays free: some terminals go on to the next line when it is filled.
-    std::fputs(progressLine(*progress, columnsOf(m_stream) - 1).c_str(), m_stream);
-    std::fflush(m_stream);
-    m_isDrawn = true;
 }
 
 void ProgressBar::removed(const Report::Progress*)
 {
-    wipe();
-}
-
-void ProgressBar::wipe()
-{
-    if (m_isDrawn) {
-        std::fputs("\r\x1b[K", m_stream);
-        std::fflush(m_stream);
-        m_isDrawn = false;
-    }
+    m_line.wipe();
 }
 
 } // namespace Host

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "host/commands/TerminalLine.h"
+
 #include <EditorModel/bus/View.h>
 #include <EditorModel/services/Report.h>
 
@@ -27,11 +29,8 @@ private:
     using Message::View<Report::Progress>::changed;
     void changed(const Report::Progress* progress) override;
     void removed(const Report::Progress* progress) override;
-    void wipe();
 
-    std::FILE* const m_stream;
-    const bool m_isTerminal;
-    bool m_isDrawn = false;
+    TerminalLine m_line;
 };
 
 } // namespace Host
