@@ -49,12 +49,22 @@ QString nameOf(const Overlay::Preset& preset, const QString& otherwise)
     return preset.tag.isEmpty() ? otherwise : preset.tag;
 }
 
-/// None if no package has the preset.
+/// A slip in an identifier is not to become a title's text.
+void requireNoPackage(const QString& id, const PackageShelf& shelf)
+{
+    const QString appId = id.section('.', 0, 0);
+    if (appId != id && shelf.package(appId)) {
+        throw Refusal(id, "is no title of the package " + appId);
+    }
+}
+
+/// None if the word names nothing in a package.
 std::optional<Title> packagedTitle(const QString& word, const PackageShelf& shelf)
 {
     const QString id = word.section('=', 0, 0);
     const auto* const found = shelf.find<Overlay::Preset>(id);
     if (!found) {
+        requireNoPackage(id, shelf);
         return std::nullopt;
     }
     if (id == word) {

@@ -19,7 +19,8 @@ struct Title
 };
 
 /// What a word of a command stands for, the first of
-/// - the preset of a package with this identifier; behind it "=" and the text of its first item may stand;
+/// - the preset of a package with this identifier; behind it "=" and the text of its first item may stand. A
+///   word that begins as the package's identifiers do stands for nothing else;
 /// - where the word is the name of a document, by its ending, the preset in that;
 /// - a preset of this text alone.
 /// The shelf may be null. Throws Refusal where the document is missing or holds no preset, or the preset no

@@ -280,8 +280,10 @@ TEST_F(PackagedEditScript, TakesTitlesFromPackages)
     // The package's own preset keeps its text.
     EXPECT_EQ(shelf.find<Overlay::Preset>("extras.banner")->items.front().text, "above");
     EXPECT_EQ(refusalOf({"title", "extras.bare=text", "1"}), "extras.bare has no item for the text");
-    run({"title", "extras.unknown", "8", "1"});
-    EXPECT_EQ(presetAt(8500)->items.front().text, "extras.unknown");
+    EXPECT_EQ(refusalOf({"title", "extras.baner", "1"}), "extras.baner is no title of the package extras");
+    EXPECT_EQ(refusalOf({"title", "extras.wipe=text", "1"}), "extras.wipe is no title of the package extras");
+    run({"title", "other.banner", "8", "1"});
+    EXPECT_EQ(presetAt(8500)->items.front().text, "other.banner");
 }
 
 TEST_F(PackagedEditScript, TakesTransitionsFromPackages)
