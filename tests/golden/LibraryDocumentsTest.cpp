@@ -4,12 +4,16 @@
 #include "XmlArchives.h"
 
 #include <EditorModel/library/Indication.h>
+#include <EditorModel/library/Pack.h>
+#include <EditorModel/library/PackCatalogue.h>
 #include <EditorModel/library/PackageContent.h>
 #include <EditorModel/library/PackageStorage.h>
 #include <EditorModel/library/PersistentItem.h>
+#include <EditorModel/persistence/Json.h>
 
 #include <gtest/gtest.h>
 
+#include <memory>
 #include <string>
 
 namespace {
@@ -150,6 +154,47 @@ const std::string item = begin + R"(	<uniqueId>{1}</uniqueId>
 	</customStrings>
 )" + end;
 
+// Lists and maps of Qt have a count alone.
+const std::string catalogue = begin + R"(	<packs class_id="1" tracking_level="0" version="0">
+		<count>3</count>
+		<item class_id="2" tracking_level="1" version="0" object_id="_1">
+			<appId>weather</appId>
+			<locale2productName class_id="3" tracking_level="0" version="0">
+				<count>2</count>
+				<item class_id="4" tracking_level="0" version="0">
+					<first>de_DE</first>
+					<second>Wetter</second>
+				</item>
+				<item>
+					<first>en_US</first>
+					<second>Weather</second>
+				</item>
+			</locale2productName>
+			<locale2previewUrl>
+				<count>1</count>
+				<item>
+					<first>en_US</first>
+					<second>https://example.org/weather.png</second>
+				</item>
+			</locale2previewUrl>
+			<downloadUrl>https://example.org/weather.zip</downloadUrl>
+		</item>
+		<item class_id_reference="2" object_id_reference="_1"></item>
+		<item class_id="-1"></item>
+	</packs>
+)" + end;
+
+constexpr const char* catalogueJson = R"({"content": {"packs": {"count": 3, "item": [
+    {"$meta": {"class": "Package::InApp::Pack", "id": 1},
+     "appId": "weather",
+     "locale2productName": {"count": 2, "item": [
+        {"first": "de_DE", "second": "Wetter"}, {"first": "en_US", "second": "Weather"}]},
+     "locale2previewUrl": {"count": 1, "item": [
+        {"first": "en_US", "second": "https://example.org/weather.png"}]},
+     "downloadUrl": "https://example.org/weather.zip"},
+    {"$meta": {"class": "Package::InApp::Pack", "ref": 1}},
+    null]}}})";
+
 TEST(PackageDocuments, TheXmlArchiveIsAsWrittenDown)
 {
     Package::Resource resource;
@@ -218,6 +263,42 @@ TEST(ItemDocuments, TheXmlArchiveIsAsWrittenDown)
     EXPECT_EQ(saved(read), item);
     EXPECT_EQ(read.collectionId, "Transitions");
     EXPECT_EQ(read.preview, nullptr);
+}
+
+void expectWeather(const Package::InApp::Object& read, const Package::InApp::Pack& weather)
+{
+    ASSERT_EQ(read.packs.size(), 3);
+    const std::unique_ptr<const Package::InApp::Pack> pack(read.packs[0]);
+    ASSERT_TRUE(pack);
+    EXPECT_TRUE(*pack == weather);
+    EXPECT_EQ(read.packs[1], pack.get());
+    EXPECT_EQ(read.packs[2], nullptr);
+}
+
+TEST(CatalogueDocuments, AreAsWrittenDown)
+{
+    Package::InApp::Pack weather;
+    weather.appId = "weather";
+    weather.locale2productName = {{"en_US", "Weather"}, {"de_DE", "Wetter"}};
+    weather.locale2previewUrl = {{"en_US", "https://example.org/weather.png"}};
+    weather.downloadUrl = "https://example.org/weather.zip";
+    Package::InApp::Object written;
+    written.packs = {&weather, &weather, nullptr};
+
+    EXPECT_EQ(saved(written), catalogue);
+    Package::InApp::Object fromXml;
+    load(catalogue, fromXml);
+    expectWeather(fromXml, weather);
+
+    const Package::InApp::Object& constant = written;
+    nlohmann::json root;
+    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", constant);
+    EXPECT_EQ(root, nlohmann::json::parse(catalogueJson));
+    const auto stored = nlohmann::json::parse(catalogueJson);
+    Package::InApp::Object content;
+    Serialize::Json::iarchive archive(stored);
+    archive >> BOOST_SERIALIZATION_NVP(content);
+    expectWeather(content, weather);
 }
 
 } // namespace
