@@ -2,6 +2,7 @@
 // What documents with packages, marks and items of collections look like, written down by hand. Stored data
 // is for life: these texts are never written anew from what the code gives.
 #include "XmlArchives.h"
+#include "tests/shared/FieldVisitors.h"
 
 #include <EditorModel/library/Indication.h>
 #include <EditorModel/library/Pack.h>
@@ -195,6 +196,49 @@ constexpr const char* catalogueJson = R"({"content": {"packs": {"count": 3, "ite
     {"$meta": {"class": "Package::InApp::Pack", "ref": 1}},
     null]}}})";
 
+// Each list has an add-on of its own.
+constexpr const char* packageJson = R"({"content": {
+    "overlays": {"count": 1, "item_version": 0, "item": [{
+        "contentPath": "titles", "translationDir": "titles/lang",
+        "category2collection": {"count": 1, "item_version": 0, "item": [{"first": "Rain", "second": "Title"}]},
+        "resources": {"count": 1, "item_version": 0, "item": [
+            {"type": 3, "id": "rain", "file": "rain.mov", "intro": 100, "outro": 250, "count": 2}]}}]},
+    "transitions": {"count": 1, "item_version": 0, "item": [{
+        "contentPath": "wipes", "translationDir": "",
+        "category2collection": {"count": 0, "item_version": 0}, "resources": {"count": 0, "item_version": 0}}]},
+    "effects": {"count": 1, "item_version": 0, "item": [{
+        "contentPath": "blurs", "translationDir": "",
+        "category2collection": {"count": 0, "item_version": 0}, "resources": {"count": 0, "item_version": 0}}]},
+    "imports": {"count": 1, "item_version": 0, "item": [{
+        "contentPath": "songs", "translationDir": "",
+        "category2collection": {"count": 0, "item_version": 0}, "resources": {"count": 0, "item_version": 0}}]},
+    "fontsDir": "fonts",
+    "quizzes": {"count": 1, "item_version": 0, "item": [{
+        "contentPath": "riddles", "translationDir": "",
+        "category2collection": {"count": 0, "item_version": 0}, "resources": {"count": 0, "item_version": 0}}]}}})";
+
+constexpr const char* marksJson = R"({"content": {
+    "id": "Effects",
+    "favoriteItems": {"count": 1, "item_version": 0, "item": ["blur"]},
+    "newItems": {"count": 2, "item_version": 0, "item": ["glow", "haze"]},
+    "knownItems": {"count": 1, "item_version": 0, "item": ["dawn"]}}})";
+
+template <class T>
+nlohmann::json savedAsJson(const T& written)
+{
+    nlohmann::json root;
+    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", written);
+    return root;
+}
+
+template <class T>
+void loadJson(const char* document, T& content)
+{
+    const auto stored = nlohmann::json::parse(document);
+    Serialize::Json::iarchive archive(stored);
+    archive >> BOOST_SERIALIZATION_NVP(content);
+}
+
 TEST(PackageDocuments, TheXmlArchiveIsAsWrittenDown)
 {
     Package::Resource resource;
@@ -221,6 +265,54 @@ TEST(PackageDocuments, TheXmlArchiveIsAsWrittenDown)
     ASSERT_EQ(read.overlays[0].resources.size(), 1u);
     EXPECT_EQ(read.overlays[0].resources[0].file, "rain.mov");
     EXPECT_EQ(read.overlays[0].resources[0].timing.loopMinCount, 2);
+}
+
+TEST(PackageDocuments, TheJsonArchiveIsAsWrittenDown)
+{
+    const auto addOnAt = [](const char* path) {
+        Package::CollectionAddOn addOn;
+        addOn.contentPath = path;
+        return addOn;
+    };
+    Package::Resource resource;
+    resource.type = Package::Resource::Type(3);
+    resource.id = "rain";
+    resource.file = "rain.mov";
+    resource.timing.intro = 100;
+    resource.timing.outro = 250;
+    resource.timing.loopMinCount = 2;
+    Package::Object written;
+    written.overlays = {addOnAt("titles")};
+    written.overlays[0].translationDir = "titles/lang";
+    written.overlays[0].category2collection = {{"Rain", "Title"}};
+    written.overlays[0].resources = {resource};
+    written.transitions = {addOnAt("wipes")};
+    written.effects = {addOnAt("blurs")};
+    written.imports = {addOnAt("songs")};
+    written.quizzes = {addOnAt("riddles")};
+    written.fontsDir = "fonts";
+    EXPECT_EQ(savedAsJson(written), nlohmann::json::parse(packageJson));
+
+    Package::Object read;
+    loadJson(packageJson, read);
+    EXPECT_EQ(Testing::Dump::of(read), Testing::Dump::of(written));
+    ASSERT_EQ(read.quizzes.size(), 1u);
+    EXPECT_EQ(read.quizzes[0].contentPath, "riddles");
+}
+
+TEST(IndicationDocuments, TheJsonArchiveIsAsWrittenDown)
+{
+    Indication::Object written;
+    written.id = "Effects";
+    written.favoriteItems = {"blur"};
+    written.newItems = {"haze", "glow"};
+    written.knownItems = {"dawn"};
+    EXPECT_EQ(savedAsJson(written), nlohmann::json::parse(marksJson));
+
+    Indication::Object read;
+    loadJson(marksJson, read);
+    EXPECT_EQ(Testing::Dump::of(read), Testing::Dump::of(written));
+    EXPECT_EQ(read.knownItems.count("dawn"), 1u);
 }
 
 TEST(PackageStorageDocuments, TheXmlArchiveIsAsWrittenDown)
@@ -290,15 +382,10 @@ TEST(CatalogueDocuments, AreAsWrittenDown)
     load(catalogue, fromXml);
     expectWeather(fromXml, weather);
 
-    const Package::InApp::Object& constant = written;
-    nlohmann::json root;
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", constant);
-    EXPECT_EQ(root, nlohmann::json::parse(catalogueJson));
-    const auto stored = nlohmann::json::parse(catalogueJson);
-    Package::InApp::Object content;
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
-    expectWeather(content, weather);
+    EXPECT_EQ(savedAsJson(written), nlohmann::json::parse(catalogueJson));
+    Package::InApp::Object fromJson;
+    loadJson(catalogueJson, fromJson);
+    expectWeather(fromJson, weather);
 }
 
 } // namespace
