@@ -36,6 +36,7 @@ int main(int argc, char** argv)
     Host::addNew(line);
     Host::addEdit(line);
     Host::addPicture(line);
+    Host::addThumbs(line);
     Host::addPlay(line);
     Host::addCheck(line);
     Host::addConvert(line);

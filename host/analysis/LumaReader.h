@@ -10,6 +10,8 @@
 
 namespace Host {
 
+class VideoDecoder;
+
 /// The brightness of a picture, row by row from the top.
 struct LumaPicture
 {
@@ -40,8 +42,7 @@ public:
     bool next(LumaPicture& picture);
 
 private:
-    struct Decoder;
-    const std::unique_ptr<Decoder> m_decoder;
+    const std::unique_ptr<VideoDecoder> m_decoder;
 };
 
 } // namespace Host

@@ -17,6 +17,7 @@ void addCheck(CommandLine& line);
 void addConvert(CommandLine& line);
 void addCompare(CommandLine& line);
 void addPlay(CommandLine& line);
+void addThumbs(CommandLine& line);
 
 void addNew(CommandLine& line);
 void addEdit(CommandLine& line);

@@ -7,6 +7,7 @@
 #include "host/commands/PictureCommand.h"
 #include "host/commands/PlayCommand.h"
 #include "host/commands/ShowCommand.h"
+#include "host/commands/ThumbsCommand.h"
 #include "host/media/MediaProbe.h"
 #include "host/project/FaultList.h"
 #include "host/text/TimeText.h"
@@ -124,6 +125,30 @@ void addCompare(CommandLine& line)
     line.needPictures(command);
 }
 
+void addThumbs(CommandLine& line)
+{
+    struct Arguments
+    {
+        std::string project;
+        std::string picture;
+    };
+    const auto arguments = std::make_shared<Arguments>();
+    CLI::App& command =
+        line.add("thumbs", "Draw the timeline of a project with pictures of its media", [arguments] {
+            showMediaLibraryLog(false);
+            return drawThumbs(fileName(arguments->project), fileName(arguments->picture));
+        });
+    command.add_option("PROJECT", arguments->project, "A document with a timeline")
+        ->required()
+        ->type_name("");
+    command
+        .add_option("OUT", arguments->picture,
+                    "Where the picture goes: .png or .svg; else beside the project, as NAME-thumbs.png")
+        ->type_name("")
+        ->check(checkOutputName);
+    line.needPictures(command);
+}
+
 void addPlay(CommandLine& line)
 {
     struct Arguments
@@ -155,8 +180,9 @@ void addPlay(CommandLine& line)
         ->check(CLI::Range(0, 1000).description(""))
         ->capture_default_str();
     command.add_flag("--dry", arguments->isDry, "Don't wait from one step to the next");
-    command.footer("Nothing is decoded: each sound is taken to be at full scale, so that the levels are those "
-                   "which volumes, envelopes and fades make of it.\n");
+    command.footer(
+        "Nothing is decoded: each sound is taken to be at full scale, so that the levels are those "
+        "which volumes, envelopes and fades make of it.\n");
     line.needPictures(command);
 }
 

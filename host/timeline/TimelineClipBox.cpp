@@ -1,9 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "host/timeline/TimelineClipBox.h"
 
+#include "host/analysis/FilmstripMaker.h"
 #include "host/drawing/Axis.h"
+#include "host/drawing/Picture.h"
 #include "host/text/TimeText.h"
 #include "host/timeline/TimelineStyle.h"
+
+#include <EditorModel/types/Image.h>
 
 #include <QFileInfo>
 #include <QFontMetricsF>
@@ -30,7 +34,7 @@ class ClipBox
 {
 public:
     ClipBox(QPainter& painter, const TimelineLayout& layout, const TimelineOutline& outline,
-            const Timeline::Clip& clip)
+            const Timeline::Clip& clip, const Filmstrip::Object* filmstrip)
         : m_painter(painter),
           m_layout(layout),
           m_clip(clip),
@@ -38,7 +42,8 @@ public:
           m_number(outline.numberOf(&clip)),
           m_isOff(!clip.enabled || isOffByTrack(outline.timeline(), clip)),
           m_colours(m_isOff ? Style::offColours() : Style::coloursOf(kindOf(clip))),
-          m_box(layout.boxOf(&clip))
+          m_box(layout.boxOf(&clip)),
+          m_filmstrip(filmstrip && filmstrip->payload ? filmstrip : nullptr)
     {}
 
     void draw() const
@@ -52,6 +57,7 @@ public:
         m_painter.setClipPath(outline, Qt::IntersectClip);
         fill();
         if (m_box.width() >= leastDetailWidth) {
+            drawPictures();
             drawFades();
             drawTrims();
             drawName();
@@ -73,6 +79,25 @@ private:
             m_painter.fillRect(clipBody(m_box), QBrush(QColor(203, 213, 225), Qt::BDiagPattern));
         }
         m_painter.fillRect(clipStrip(m_box), m_colours.strip);
+    }
+
+    /// Side by side from the left edge, cut off at the right one.
+    void drawPictures() const
+    {
+        if (!m_filmstrip) {
+            return;
+        }
+        const QRectF body = clipBody(m_box);
+        QRectF place(body.topLeft(), QSizeF(double(m_filmstrip->width) / pngScale, body.height()));
+        m_painter.setOpacity(m_isOff ? 0.4 : 1.0);
+        m_painter.setRenderHint(QPainter::SmoothPixmapTransform);
+        for (const Thumbnail::Object& picture : m_filmstrip->payload->pictures) {
+            if (picture.image && !picture.image->isNull()) {
+                m_painter.drawPixmap(place, *picture.image, QRectF(picture.image->rect()));
+            }
+            place.moveLeft(place.right());
+        }
+        m_painter.setOpacity(1.0);
     }
 
     /// What a fade takes away is shaded, as it is in the picture of an envelope.
@@ -225,6 +250,12 @@ private:
                 }
             }
         }
+        if (m_filmstrip && !line.isEmpty()) {
+            QColor ground = m_colours.body;
+            ground.setAlpha(215);
+            const double width = metrics.horizontalAdvance(line) + 6.0;
+            m_painter.fillRect(QRectF(area.left() - 3.0, area.top(), width, area.height()), ground);
+        }
         m_painter.drawText(area, Qt::AlignLeft | Qt::AlignVCenter | Qt::TextDontClip, line);
     }
 
@@ -236,6 +267,8 @@ private:
     const bool m_isOff;
     const Style::ClipColours m_colours;
     const QRectF m_box;
+    /// Null if there are no pictures.
+    const Filmstrip::Object* const m_filmstrip;
 };
 
 } // namespace
@@ -251,9 +284,9 @@ QRectF clipBody(const QRectF& box)
 }
 
 void drawClipBox(QPainter& painter, const TimelineLayout& layout, const TimelineOutline& outline,
-                 const Timeline::Clip& clip)
+                 const Timeline::Clip& clip, const Filmstrip::Object* filmstrip)
 {
-    ClipBox(painter, layout, outline, clip).draw();
+    ClipBox(painter, layout, outline, clip, filmstrip).draw();
 }
 
 } // namespace Host

@@ -2,6 +2,7 @@
 #include "host/timeline/TimelinePicture.h"
 
 #include "host/media/MediaText.h"
+#include "host/timeline/ClipFilmstrips.h"
 #include "host/timeline/TimelineClipBox.h"
 #include "host/timeline/TimelineLabels.h"
 #include "host/timeline/TimelineLanes.h"
@@ -42,7 +43,7 @@ void TimelinePicture::draw(QPainter& painter) const
     ruler.drawGrid(painter);
     drawLaneHeads(painter, m_layout, m_outline);
     for (const Timeline::Clip* clip : m_outline.clips()) {
-        drawClipBox(painter, m_layout, m_outline, *clip);
+        drawClipBox(painter, m_layout, m_outline, *clip, m_filmstrips ? m_filmstrips->of(*clip) : nullptr);
     }
     const TimelineTies ties(m_layout, m_outline);
     ties.drawTransitions(painter);

@@ -6,6 +6,8 @@
 
 namespace Host {
 
+class ClipFilmstrips;
+
 /// A timeline: a ruler, and below it a row for each level of each track with its clips and what ties them
 /// together. The timeline must outlive it, and stays as it is.
 class TimelinePicture : public Picture
@@ -17,6 +19,9 @@ public:
     QSize size() const override { return m_layout.size(); }
     void draw(QPainter& painter) const override;
 
+    /// From now on clips are drawn with these, which must outlive it; null for none.
+    void showFilmstrips(const ClipFilmstrips* filmstrips) { m_filmstrips = filmstrips; }
+
     const TimelineOutline& outline() const { return m_outline; }
     const TimelineLayout& layout() const { return m_layout; }
 
@@ -27,6 +32,7 @@ private:
     const QString m_title;
     const TimelineOutline m_outline;
     const TimelineLayout m_layout;
+    const ClipFilmstrips* m_filmstrips = nullptr;
 };
 
 } // namespace Host
