@@ -5,10 +5,9 @@
 #include "tests/host/shared/Terminal.h"
 
 #include "host/commands/LevelLine.h"
+#include "host/playback/Player.h"
 #include "host/playback/SoundMeter.h"
 #include "host/playback/SoundOutput.h"
-
-#include "host/playback/Player.h"
 
 #include <EditorModel/persistence/Document.h>
 
@@ -19,7 +18,6 @@ namespace {
 using namespace HostTests;
 using testing::HasSubstr;
 using testing::IsEmpty;
-using testing::StartsWith;
 using Timeline::Clip;
 
 std::string bar(std::size_t cells)
