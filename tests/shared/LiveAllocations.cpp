@@ -9,12 +9,18 @@ namespace {
 std::atomic<long> live{0};
 }
 
+void* operator new(std::size_t size, const std::nothrow_t&) noexcept
+{
+    void* const memory = std::malloc(size ? size : 1);
+    if (memory)
+        ++live;
+    return memory;
+}
+
 void* operator new(std::size_t size)
 {
-    if (void* memory = std::malloc(size ? size : 1)) {
-        ++live;
+    if (void* const memory = operator new(size, std::nothrow))
         return memory;
-    }
     throw std::bad_alloc();
 }
 
