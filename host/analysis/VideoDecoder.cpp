@@ -4,7 +4,6 @@
 extern "C" {
 #include <libavcodec/avcodec.h>
 #include <libavformat/avformat.h>
-#include <libavutil/display.h>
 }
 
 namespace Host {
@@ -17,17 +16,6 @@ const AVStream& videoOf(const MediaInput& input, int track)
         throw MediaError(QString("has no video track %1").arg(track));
     }
     return input.stream(std::size_t(track));
-}
-
-const std::uint8_t* displayMatrix(const AVStream& stream)
-{
-#if LIBAVFORMAT_VERSION_INT >= AV_VERSION_INT(60, 15, 100)
-    const AVPacketSideData* const data = av_packet_side_data_get(
-        stream.codecpar->coded_side_data, stream.codecpar->nb_coded_side_data, AV_PKT_DATA_DISPLAYMATRIX);
-    return data ? data->data : nullptr;
-#else
-    return av_stream_get_side_data(&stream, AV_PKT_DATA_DISPLAYMATRIX, nullptr);
-#endif
 }
 
 std::int64_t startOf(const AVStream& stream)
@@ -115,8 +103,7 @@ void VideoDecoder::seek(MTime time)
 
 double VideoDecoder::turn() const
 {
-    const std::uint8_t* const matrix = displayMatrix(m_stream);
-    return matrix ? av_display_rotation_get(reinterpret_cast<const std::int32_t*>(matrix)) : 0.0;
+    return turnOf(m_stream);
 }
 
 } // namespace Host

@@ -16,11 +16,23 @@ extern "C" {
 #include <libavcodec/packet.h>
 #include <libavformat/avformat.h>
 #include <libavutil/dict.h>
+#include <libavutil/display.h>
 #include <libavutil/error.h>
 }
 
 namespace Host {
 namespace {
+
+const std::uint8_t* displayMatrix(const AVStream& stream)
+{
+#if LIBAVFORMAT_VERSION_INT >= AV_VERSION_INT(60, 15, 100)
+    const AVPacketSideData* const data = av_packet_side_data_get(
+        stream.codecpar->coded_side_data, stream.codecpar->nb_coded_side_data, AV_PKT_DATA_DISPLAYMATRIX);
+    return data ? data->data : nullptr;
+#else
+    return av_stream_get_side_data(&stream, AV_PKT_DATA_DISPLAYMATRIX, nullptr);
+#endif
+}
 
 QString textOf(int error)
 {
@@ -245,6 +257,12 @@ bool MediaInput::holdsDataFrom(std::int64_t avTime)
         av_packet_unref(packet.get());
     }
     return reached;
+}
+
+double turnOf(const AVStream& stream)
+{
+    const std::uint8_t* const matrix = displayMatrix(stream);
+    return matrix ? av_display_rotation_get(reinterpret_cast<const std::int32_t*>(matrix)) : 0.0;
 }
 
 } // namespace Host

@@ -67,4 +67,7 @@ private:
     std::unique_ptr<AVFormatContext, CloseContext> m_context;
 };
 
+/// How a stream's pictures are to be turned for show, in degrees to the left; 0 where the file doesn't tell.
+double turnOf(const AVStream& stream);
+
 } // namespace Host

@@ -14,7 +14,6 @@
 extern "C" {
 #include <libavcodec/avcodec.h>
 #include <libavformat/avformat.h>
-#include <libavutil/display.h>
 #include <libavutil/log.h>
 #include <libavutil/pixdesc.h>
 }
@@ -34,26 +33,10 @@ std::string codecName(const AVCodecParameters& codec)
     return codec.codec_tag == 0 ? "unknown" : av_fourcc_make_string(tag, codec.codec_tag);
 }
 
-const std::uint8_t* displayMatrix(const AVStream& stream)
-{
-#if LIBAVFORMAT_VERSION_INT >= AV_VERSION_INT(60, 15, 100)
-    const AVPacketSideData* const data = av_packet_side_data_get(
-        stream.codecpar->coded_side_data, stream.codecpar->nb_coded_side_data, AV_PKT_DATA_DISPLAYMATRIX);
-    return data ? data->data : nullptr;
-#else
-    return av_stream_get_side_data(&stream, AV_PKT_DATA_DISPLAYMATRIX, nullptr);
-#endif
-}
-
 /// The file asks for the picture to be shown lying on its side.
 bool hasQuarterTurn(const AVStream& stream)
 {
-    const std::uint8_t* const matrix = displayMatrix(stream);
-    if (!matrix) {
-        return false;
-    }
-    const double degrees = av_display_rotation_get(reinterpret_cast<const std::int32_t*>(matrix));
-    return std::lround(degrees / 90.0) % 2 != 0;
+    return std::lround(turnOf(stream) / 90.0) % 2 != 0;
 }
 
 bool isStillPicture(const MediaInput& input, const AVStream& stream)
