@@ -7,8 +7,8 @@
 
 namespace Host {
 
-/// Prints what is in a project, or the timelines, the media files and the resources of another document, as they were when it was saved; the
-/// files themselves are not looked at.
+/// Prints what is in a project, or the timelines, the media files and the resources of another document, as
+/// they were when it was saved; the files themselves are not looked at.
 ExitCode show(const QString& path);
 
 } // namespace Host

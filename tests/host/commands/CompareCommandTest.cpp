@@ -46,8 +46,8 @@ TEST_F(CompareCommand, TellsOfEachThatDiffersWhere)
 {
     Media::File file;
     file.setPath("one.mov");
-    for (const auto& [name, other] : {std::pair("a.json", "one.mov"), std::pair("b.json", "two.mov"),
-                                      std::pair("c.json", "one.mov")}) {
+    for (const auto& [name, other] :
+         {std::pair("a.json", "one.mov"), std::pair("b.json", "two.mov"), std::pair("c.json", "one.mov")}) {
         file.setPath(other);
         Document::saveFile(path(name), {&file}, Document::Json, Document::Stream);
     }
