@@ -3,6 +3,11 @@
 
 #include <EditorModel/persistence/Serializable.h>
 
+#include <nlohmann/json.hpp>
+
+#include <QPointF>
+#include <QString>
+
 #include <algorithm>
 #include <stdexcept>
 #include <utility>
@@ -14,6 +19,13 @@ bool isOf(const std::vector<StoredField>& fields, const std::vector<std::string>
 {
     return std::equal(fields.begin(), fields.end(), keys.begin(), keys.end(),
                       [](const StoredField& field, const std::string& key) { return field.key == key; });
+}
+
+/// Numbers in full, texts in quotes.
+template <class T>
+std::string textOf(const T& value)
+{
+    return nlohmann::json(value).dump();
 }
 
 /// An item, by its keys.
@@ -47,7 +59,7 @@ std::string containerOf(const std::vector<StoredField>& items)
 class Writer final : public Serialize::ISerializer
 {
 public:
-    void writePointer(const Serialize::ISerializable*) override { m_stream.pointer(); }
+    void writePointer(const Serialize::ISerializable* object) override { m_stream.pointer(!object); }
     Serialize::ISerializer& writeObject(const Serialize::ISerializable& object) override
     {
         m_stream.object();
@@ -56,7 +68,7 @@ public:
     }
     Serialize::IFieldStream& stream() override { return m_stream; }
 
-    KindStream m_stream{false};
+    RecordingStream m_stream{false};
 };
 
 class Reader final : public Serialize::IDeserializer
@@ -65,7 +77,7 @@ public:
     void readPointer(Serialize::ISerializable*& object) override
     {
         object = nullptr;
-        m_stream.pointer();
+        m_stream.pointer(true);
     }
     Serialize::IDeserializer& readObject(Serialize::ISerializable& object) override
     {
@@ -75,51 +87,52 @@ public:
     }
     Serialize::IFieldStream& stream() override { return m_stream; }
 
-    KindStream m_stream{true};
+    RecordingStream m_stream{true};
 };
 
 } // namespace
 
-std::vector<StoredField> KindStream::fields() const
+std::vector<StoredField> RecordingStream::fields() const
 {
     if (!m_open.empty())
         throw std::logic_error("an object that did not end");
     return m_fields;
 }
 
-KindStream::Scope& KindStream::scope()
+RecordingStream::Scope& RecordingStream::scope()
 {
     if (m_open.empty())
         throw std::logic_error("a field outside of any object");
     return m_open.back();
 }
 
-void KindStream::setKind(const std::string& kind)
+void RecordingStream::set(const std::string& kind, const std::string& value)
 {
     if (scope().empty() || !scope().back().kind.empty())
         throw std::logic_error(kind + " without a key of its own");
     scope().back().kind = kind;
+    scope().back().value = value;
 }
 
-KindStream::Scope KindStream::closed()
+RecordingStream::Scope RecordingStream::closed()
 {
     Scope fields = std::move(scope());
     m_open.pop_back();
     return fields;
 }
 
-void KindStream::beginItem(const Serialize::ItemRecord&)
+void RecordingStream::beginItem(const Serialize::ItemRecord&)
 {
     m_open.emplace_back();
 }
 
-void KindStream::endItem(const Serialize::ItemRecord&)
+void RecordingStream::endItem(const Serialize::ItemRecord&)
 {
     const StoredField item = itemOf(closed());
     scope().push_back(item);
 }
 
-void KindStream::beginSequence(int* count)
+void RecordingStream::beginSequence(int* count)
 {
     // A pair or a tuple comes with its count.
     if (m_furnishes && *count == 0)
@@ -127,29 +140,90 @@ void KindStream::beginSequence(int* count)
     m_open.emplace_back();
 }
 
-void KindStream::endSequence(const Serialize::CountRecord&)
+void RecordingStream::endSequence(const Serialize::CountRecord&)
 {
-    const std::string kind = containerOf(closed());
-    setKind(kind);
+    const Scope items = closed();
+    set(containerOf(items), items.empty() ? "empty" : std::to_string(items.size()) + " items");
 }
 
-void KindStream::beginClass(const Serialize::ClassRecord& record)
+void RecordingStream::beginClass(const Serialize::ClassRecord& record)
 {
     if (!m_open.empty())
-        setKind((std::exchange(m_isObject, false) ? "object " : "base ") + std::string(record.name));
+        set((std::exchange(m_isObject, false) ? "object " : "base ") + std::string(record.name), "");
     m_open.emplace_back();
 }
 
-void KindStream::endClass(const Serialize::ClassRecord&)
+void RecordingStream::endClass(const Serialize::ClassRecord&)
 {
     Scope fields = closed();
     if (m_open.empty())
         m_fields = std::move(fields);
+    else
+        scope().back().value = valueOf(fields);
 }
 
-void KindStream::field(const Serialize::FieldRecord& record)
+void RecordingStream::field(const Serialize::FieldRecord& record)
 {
     scope().push_back({record.name, std::string()});
+}
+
+void RecordingStream::value(std::shared_ptr<const Types::Image>* value)
+{
+    set("picture", *value ? "set" : "null");
+}
+
+void RecordingStream::value(QPointF* value)
+{
+    set("point", '(' + textOf(value->x()) + ", " + textOf(value->y()) + ')');
+}
+
+void RecordingStream::value(QString* value)
+{
+    set("QString", textOf(value->toStdString()));
+}
+
+void RecordingStream::value(std::string* value)
+{
+    set("string", textOf(*value));
+}
+
+void RecordingStream::value(MTime* value)
+{
+    set("time", textOf(value->ms()) + " ms");
+}
+
+void RecordingStream::value(double* value)
+{
+    set("double", textOf(*value));
+}
+
+void RecordingStream::value(qint64* value)
+{
+    set("int64", textOf(*value));
+}
+
+// Colours, all of them.
+void RecordingStream::value(quint32* value)
+{
+    set("uint32", QStringLiteral("0x%1").arg(*value, 8, 16, QLatin1Char('0')).toStdString());
+}
+
+void RecordingStream::value(qint32* value)
+{
+    set("int32", textOf(*value));
+}
+
+void RecordingStream::value(bool* value)
+{
+    set("bool", textOf(*value));
+}
+
+std::string valueOf(const std::vector<StoredField>& fields)
+{
+    std::string text;
+    for (const StoredField& field : fields)
+        text += (text.empty() ? "" : ", ") + field.key + ' ' + field.value;
+    return '{' + text + '}';
 }
 
 std::vector<StoredField> written(const Serialize::ISerializable& object)

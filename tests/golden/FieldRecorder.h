@@ -7,17 +7,17 @@
 
 namespace GoldenTests {
 
-/// A field stream that keeps the keys of one object and what stands under them, and no value. It takes part
-/// in both directions; a reader finds one item in every container that the object has empty.
-class KindStream final : public Serialize::IFieldStream
+/// A field stream that keeps the keys of one object and what stands under them. It takes part in both
+/// directions, and stores nothing; a reader finds one item in every container that the object has empty.
+class RecordingStream final : public Serialize::IFieldStream
 {
 public:
-    explicit KindStream(bool furnishes) : m_furnishes(furnishes) {}
+    explicit RecordingStream(bool furnishes) : m_furnishes(furnishes) {}
 
     /// The fields of the outermost object. A container without items is a "sequence" of nothing.
     std::vector<StoredField> fields() const;
 
-    void pointer() { setKind("pointer"); }
+    void pointer(bool isNull) { set("pointer", isNull ? "null" : "set"); }
     /// The class that begins next is an object held by value, and no base.
     void object() { m_isObject = true; }
 
@@ -29,23 +29,24 @@ public:
     void beginClass(const Serialize::ClassRecord& record) override;
     void field(const Serialize::FieldRecord& record) override;
 
-    void value(std::shared_ptr<const Types::Image>*) override { setKind("picture"); }
-    void value(QPointF*) override { setKind("point"); }
-    void value(QString*) override { setKind("QString"); }
-    void value(std::string*) override { setKind("string"); }
-    void value(MTime*) override { setKind("time"); }
-    void value(double*) override { setKind("double"); }
-    void value(qint64*) override { setKind("int64"); }
-    void value(quint32*) override { setKind("uint32"); }
-    void value(qint32*) override { setKind("int32"); }
-    void value(bool*) override { setKind("bool"); }
+    void value(std::shared_ptr<const Types::Image>* value) override;
+    void value(QPointF* value) override;
+    void value(QString* value) override;
+    void value(std::string* value) override;
+    void value(MTime* value) override;
+    void value(double* value) override;
+    void value(qint64* value) override;
+    void value(quint32* value) override;
+    void value(qint32* value) override;
+    void value(bool* value) override;
 
 private:
     using Scope = std::vector<StoredField>;
 
     /// The fields of a class or an item, or the items of a container.
     Scope& scope();
-    void setKind(const std::string& kind);
+    /// What stands under the key announced last.
+    void set(const std::string& kind, const std::string& value);
     Scope closed();
 
     const bool m_furnishes;
@@ -53,6 +54,9 @@ private:
     std::vector<Scope> m_open;
     Scope m_fields;
 };
+
+/// The values of an object in one text, key by key.
+std::string valueOf(const std::vector<StoredField>& fields);
 
 /// What `object` writes.
 std::vector<StoredField> written(const Serialize::ISerializable& object);

@@ -37,7 +37,7 @@ FieldTable storedFields()
         if (line.rfind('#', 0) == 0 || line.rfind("class\t", 0) == 0)
             continue;
         const std::vector<std::string> columns = columnsOf(line);
-        if (columns.size() != 4)
+        if (columns.size() != 5)
             refuse(number, line);
         const auto [entry, isNew] = table.try_emplace(columns[0]);
         std::vector<StoredField>& fields = entry->second;
@@ -46,7 +46,7 @@ FieldTable storedFields()
                 refuse(number, line);
             continue;
         }
-        fields.push_back({columns[2], columns[3]});
+        fields.push_back({columns[2], columns[3], columns[4]});
         if (columns[1] != std::to_string(fields.size()))
             refuse(number, line);
     }
