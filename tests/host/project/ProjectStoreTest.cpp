@@ -212,9 +212,7 @@ TEST_F(ProjectSaving, IsRefusedWhileAnotherProcessSaves)
 
 TEST_F(ProjectSaving, LeavesTheOldFileIfTheDiskIsFull)
 {
-    EXPECT_EQ(refusalAfter([] {
-                  refuseCalls({SYS_write, SYS_writev, SYS_pwrite64}, ENOSPC);
-              }),
+    EXPECT_EQ(refusalAfter([] { refuseWriting(ENOSPC); }),
               message("cannot be written: No space left on device"));
     expectUntouched();
     // Full after the first bytes.

@@ -4,6 +4,7 @@
 #include <functional>
 #include <stdexcept>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include <cstring>
@@ -69,6 +70,15 @@ const std::vector<unsigned> renamingCalls = {
 #endif
     SYS_renameat2};
 
+inline void filterCalls(std::vector<sock_filter> steps)
+{
+    const sock_fprog program{static_cast<unsigned short>(steps.size()), steps.data()};
+    if (prctl(PR_SET_NO_NEW_PRIVS, 1, 0, 0, 0) != 0 ||
+        prctl(PR_SET_SECCOMP, SECCOMP_MODE_FILTER, &program) != 0) {
+        throw std::runtime_error("calls cannot be refused");
+    }
+}
+
 /// From now on these system calls of the process end in this error. There is no way back.
 inline void refuseCalls(const std::vector<unsigned>& calls, unsigned error)
 {
@@ -78,11 +88,20 @@ inline void refuseCalls(const std::vector<unsigned>& calls, unsigned error)
         steps.push_back(BPF_STMT(BPF_RET | BPF_K, SECCOMP_RET_ERRNO | error));
     }
     steps.push_back(BPF_STMT(BPF_RET | BPF_K, SECCOMP_RET_ALLOW));
-    const sock_fprog program{static_cast<unsigned short>(steps.size()), steps.data()};
-    if (prctl(PR_SET_NO_NEW_PRIVS, 1, 0, 0, 0) != 0 ||
-        prctl(PR_SET_SECCOMP, SECCOMP_MODE_FILTER, &program) != 0) {
-        throw std::runtime_error("calls cannot be refused");
-    }
+    filterCalls(std::move(steps));
+}
+
+/// The same for writing, but of a few bytes: the checks of a sanitizer write them to a pipe to see whether
+/// memory can be read.
+inline void refuseWriting(unsigned error)
+{
+    constexpr unsigned few = 64;
+    filterCalls({BPF_STMT(BPF_LD | BPF_W | BPF_ABS, offsetof(seccomp_data, nr)),
+                 BPF_JUMP(BPF_JMP | BPF_JEQ | BPF_K, SYS_write, 0, 2),
+                 // Of this processor's two halves of the length the lower one.
+                 BPF_STMT(BPF_LD | BPF_W | BPF_ABS, offsetof(seccomp_data, args[2])),
+                 BPF_JUMP(BPF_JMP | BPF_JGE | BPF_K, few, 1, 0), BPF_STMT(BPF_RET | BPF_K, SECCOMP_RET_ALLOW),
+                 BPF_STMT(BPF_RET | BPF_K, SECCOMP_RET_ERRNO | error)});
 }
 
 } // namespace HostTests
