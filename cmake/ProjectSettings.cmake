@@ -39,3 +39,13 @@ elseif(EDITORMODEL_SANITIZE STREQUAL "thread")
 elseif(EDITORMODEL_SANITIZE)
     message(FATAL_ERROR "EDITORMODEL_SANITIZE is '${EDITORMODEL_SANITIZE}'; it takes address or thread")
 endif()
+
+if(EDITORMODEL_BUILD_FUZZERS)
+    if(NOT CMAKE_CXX_COMPILER_ID STREQUAL "Clang")
+        message(FATAL_ERROR "EDITORMODEL_BUILD_FUZZERS needs Clang, and the compiler is ${CMAKE_CXX_COMPILER_ID}: "
+            "configure a new build folder with -DCMAKE_CXX_COMPILER=clang++, or with --preset fuzz")
+    endif()
+    # The library tells the fuzzer which of its branches an input has reached.
+    add_compile_options(-fsanitize=fuzzer-no-link)
+    add_link_options(-fsanitize=fuzzer-no-link)
+endif()
