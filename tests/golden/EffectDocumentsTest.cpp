@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with the elements of a library look like, written down by hand. Stored data is for life:
 // these texts are never written anew from what the code gives.
-#include "XmlArchives.h"
+#include "TextArchives.h"
 #include "tests/shared/FieldVisitors.h"
 
 #include <EditorModel/effects/Overlay.h>
@@ -9,7 +9,6 @@
 #include <EditorModel/effects/Theme.h>
 #include <EditorModel/effects/TransformationPreset.h>
 #include <EditorModel/effects/Transition.h>
-#include <EditorModel/persistence/Json.h>
 #include <EditorModel/types/Rect.h>
 
 #include <gtest/gtest.h>
@@ -21,17 +20,6 @@ namespace {
 using namespace GoldenTests;
 using Testing::Dump;
 
-const std::string begin = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
-<!DOCTYPE boost_serialization>
-<boost_serialization signature="serialization::archive" version="18">
-<content class_id="0" tracking_level="1" version="0" object_id="_0">
-)";
-
-const std::string end = R"(</content>
-</boost_serialization>
-
-)";
-
 /// One class in both forms of text: `written` gives the documents, and they give it back.
 template <class T>
 void expectDocuments(const T& written, const std::string& xml, const char* json)
@@ -41,17 +29,14 @@ void expectDocuments(const T& written, const std::string& xml, const char* json)
     load(xml, fromXml);
     EXPECT_EQ(Dump::of(fromXml), Dump::of(written));
 
-    nlohmann::json root;
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", written);
-    EXPECT_EQ(root, nlohmann::json::parse(json));
-    const auto stored = nlohmann::json::parse(json);
+    EXPECT_EQ(savedAsJson(written), nlohmann::json::parse(json));
     T content;
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
+    loadJson(json, content);
     EXPECT_EQ(Dump::of(content), Dump::of(written));
 }
 
-const std::string transitionXml = begin + R"(	<id>fade</id>
+const std::string transitionXml = begin + R"(
+	<id>fade</id>
 	<tag>Fade</tag>
 	<description>Soft</description>
 	<strategy>2</strategy>
@@ -91,7 +76,8 @@ TEST(TransitionDocuments, AreAsWrittenDown)
     expectDocuments(transition, transitionXml, transitionJson);
 }
 
-const std::string themeXml = begin + R"(	<tag>Party</tag>
+const std::string themeXml = begin + R"(
+	<tag>Party</tag>
 	<transitionsList class_id="1" tracking_level="0" version="0">
 		<count>2</count>
 		<item_version>0</item_version>
@@ -125,7 +111,8 @@ TEST(ThemeDocuments, AreAsWrittenDown)
     expectDocuments(theme, themeXml, themeJson);
 }
 
-const std::string quizXml = begin + R"(	<questions class_id="1" tracking_level="0" version="0">
+const std::string quizXml = begin + R"(
+	<questions class_id="1" tracking_level="0" version="0">
 		<count>1</count>
 		<item_version>0</item_version>
 		<item class_id="2" tracking_level="1" version="0" object_id="_1">
@@ -172,7 +159,8 @@ TEST(QuizDocuments, AreAsWrittenDown)
 }
 
 /// "Hi" is SGk= in base64.
-const std::string overlayXml = begin + R"(	<type>5</type>
+const std::string overlayXml = begin + R"(
+	<type>5</type>
 	<scriptId>slide</scriptId>
 	<scriptSpeed>1.50000000000000000e+00</scriptSpeed>
 	<items class_id="1" tracking_level="0" version="0">
@@ -276,7 +264,8 @@ TEST(OverlayDocuments, AreAsWrittenDown)
     expectDocuments(preset, overlayXml, overlayJson);
 }
 
-const std::string transformationXml = begin + R"(	<type>7</type>
+const std::string transformationXml = begin + R"(
+	<type>7</type>
 	<tag>Zoom</tag>
 	<description>Slow</description>
 	<sourceDuration>4400</sourceDuration>
@@ -345,7 +334,8 @@ TEST(TransformationPresetDocuments, AreAsWrittenDown)
     expectDocuments(preset, transformationXml, transformationJson);
 }
 
-const std::string rectXml = begin + R"(	<top>2.00000000000000000e+00</top>
+const std::string rectXml = begin + R"(
+	<top>2.00000000000000000e+00</top>
 	<left>1.00000000000000000e+00</left>
 	<bottom>4.00000000000000000e+00</bottom>
 	<right>3.00000000000000000e+00</right>

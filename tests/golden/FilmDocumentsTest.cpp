@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with a film and an editor look like, written down by hand. Stored data is for life: these
 // texts are never written anew from what the code gives.
-#include "XmlArchives.h"
+#include "TextArchives.h"
 
 #include <EditorModel/effects/Transition.h>
 #include <EditorModel/timeline/Editor.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with packages, marks and items of collections look like, written down by hand. Stored data
 // is for life: these texts are never written anew from what the code gives.
-#include "XmlArchives.h"
+#include "TextArchives.h"
 #include "tests/shared/FieldVisitors.h"
 
 #include <EditorModel/library/Indication.h>
@@ -10,7 +10,6 @@
 #include <EditorModel/library/PackageContent.h>
 #include <EditorModel/library/PackageStorage.h>
 #include <EditorModel/library/PersistentItem.h>
-#include <EditorModel/persistence/Json.h>
 
 #include <gtest/gtest.h>
 
@@ -21,18 +20,8 @@ namespace {
 
 using namespace GoldenTests;
 
-const std::string begin = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
-<!DOCTYPE boost_serialization>
-<boost_serialization signature="serialization::archive" version="18">
-<content class_id="0" tracking_level="1" version="0" object_id="_0">
-)";
-
-const std::string end = R"(</content>
-</boost_serialization>
-
-)";
-
-const std::string package = begin + R"(	<overlays class_id="1" tracking_level="0" version="0">
+const std::string package = begin + R"(
+	<overlays class_id="1" tracking_level="0" version="0">
 		<count>1</count>
 		<item_version>0</item_version>
 		<item class_id="2" tracking_level="1" version="0" object_id="_1">
@@ -79,7 +68,8 @@ const std::string package = begin + R"(	<overlays class_id="1" tracking_level="0
 	</quizzes>
 )" + end;
 
-const std::string storage = begin + R"(	<package2storage class_id="1" tracking_level="0" version="0">
+const std::string storage = begin + R"(
+	<package2storage class_id="1" tracking_level="0" version="0">
 		<count>1</count>
 		<item_version>0</item_version>
 		<item class_id="2" tracking_level="0" version="0">
@@ -115,7 +105,8 @@ const std::string storage = begin + R"(	<package2storage class_id="1" tracking_l
 	</package2storage>
 )" + end;
 
-const std::string marks = begin + R"(	<id>Effects</id>
+const std::string marks = begin + R"(
+	<id>Effects</id>
 	<favoriteItems class_id="1" tracking_level="0" version="0">
 		<count>1</count>
 		<item_version>0</item_version>
@@ -134,7 +125,8 @@ const std::string marks = begin + R"(	<id>Effects</id>
 )" + end;
 
 // The element and the picture are null, so that no other class's fields stand in the document.
-const std::string item = begin + R"(	<uniqueId>{1}</uniqueId>
+const std::string item = begin + R"(
+	<uniqueId>{1}</uniqueId>
 	<item class_id="-1"></item>
 	<preview class_id="2" tracking_level="0" version="1">
 		<px class_id="-1"></px>
@@ -156,7 +148,8 @@ const std::string item = begin + R"(	<uniqueId>{1}</uniqueId>
 )" + end;
 
 // Lists and maps of Qt have a count alone.
-const std::string catalogue = begin + R"(	<packs class_id="1" tracking_level="0" version="0">
+const std::string catalogue = begin + R"(
+	<packs class_id="1" tracking_level="0" version="0">
 		<count>3</count>
 		<item class_id="2" tracking_level="1" version="0" object_id="_1">
 			<appId>weather</appId>
@@ -222,22 +215,6 @@ constexpr const char* marksJson = R"({"content": {
     "favoriteItems": {"count": 1, "item_version": 0, "item": ["blur"]},
     "newItems": {"count": 2, "item_version": 0, "item": ["glow", "haze"]},
     "knownItems": {"count": 1, "item_version": 0, "item": ["dawn"]}}})";
-
-template <class T>
-nlohmann::json savedAsJson(const T& written)
-{
-    nlohmann::json root;
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", written);
-    return root;
-}
-
-template <class T>
-void loadJson(const char* document, T& content)
-{
-    const auto stored = nlohmann::json::parse(document);
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
-}
 
 TEST(PackageDocuments, TheXmlArchiveIsAsWrittenDown)
 {

@@ -1,21 +1,18 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents of media files look like, written down by hand. Stored data is for life: these texts are
 // never written anew from what the code gives.
+#include "TextArchives.h"
+
 #include <EditorModel/media/Media.h>
 #include <EditorModel/persistence/Document.h>
-#include <EditorModel/persistence/Json.h>
-
-#include <boost/archive/xml_iarchive.hpp>
-#include <boost/archive/xml_oarchive.hpp>
-#include <boost/serialization/nvp.hpp>
 
 #include <gtest/gtest.h>
 
 #include <QBuffer>
 
-#include <sstream>
-
 namespace {
+
+using namespace GoldenTests;
 
 constexpr const char* xmlArchive = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
 <!DOCTYPE boost_serialization>
@@ -206,35 +203,20 @@ protected:
 
 TEST_F(MediaDocuments, TheXmlArchiveIsAsWrittenDown)
 {
-    std::ostringstream stream;
-    {
-        const Media::File& content = m_file;
-        boost::archive::xml_oarchive archive(stream);
-        archive << BOOST_SERIALIZATION_NVP(content);
-    }
-    EXPECT_EQ(stream.str(), xmlArchive);
+    EXPECT_EQ(saved(m_file), xmlArchive);
 
-    std::istringstream stored(xmlArchive);
     Media::File content;
-    {
-        boost::archive::xml_iarchive archive(stored);
-        archive >> BOOST_SERIALIZATION_NVP(content);
-    }
+    load(xmlArchive, content);
     expectWhole(content);
     freeTracks(content);
 }
 
 TEST_F(MediaDocuments, TheJsonArchiveIsAsWrittenDown)
 {
-    nlohmann::json root;
-    const Media::File& saved = m_file;
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", saved);
-    EXPECT_EQ(root, nlohmann::json::parse(jsonArchive));
+    EXPECT_EQ(savedAsJson(m_file), nlohmann::json::parse(jsonArchive));
 
-    const auto stored = nlohmann::json::parse(jsonArchive);
     Media::File content;
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
+    loadJson(jsonArchive, content);
     expectWhole(content);
     freeTracks(content);
 }

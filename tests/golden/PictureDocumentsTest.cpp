@@ -1,12 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with a picture look like, written down by hand. Stored data is for life: these texts are
 // never written anew from what the code gives.
+#include "TextArchives.h"
+
 #include <EditorModel/library/PersistentItem.h>
 #include <EditorModel/persistence/Document.h>
-#include <EditorModel/persistence/Json.h>
 #include <EditorModel/types/Image.h>
-
-#include <boost/serialization/nvp.hpp>
 
 #include <gtest/gtest.h>
 
@@ -17,6 +16,8 @@
 #include <string>
 
 namespace {
+
+using namespace GoldenTests;
 
 using Item = EditorCollection::PersistentItem<Transition::Object>;
 using Pointer = nlohmann::json::json_pointer;
@@ -83,16 +84,12 @@ void expectSameButForPacking(nlohmann::json written, const nlohmann::json& expec
 
 TEST(PictureDocuments, TheJsonArchiveIsAsWrittenDown)
 {
-    const auto stored = nlohmann::json::parse(jsonArchive);
-    nlohmann::json root;
-    const Item written = itemWithPreview();
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", written);
-    expectSameButForPacking(root, stored, Pointer("/content/preview/px/image/png/bytes"),
+    expectSameButForPacking(savedAsJson(itemWithPreview()), nlohmann::json::parse(jsonArchive),
+                            Pointer("/content/preview/px/image/png/bytes"),
                             Pointer("/content/preview/px/image/png/size"));
 
     Item content;
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
+    loadJson(jsonArchive, content);
     expectPreview(content);
 }
 

@@ -1,21 +1,18 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with a table of resources look like, written down by hand. Stored data is for life: these
 // texts are never written anew from what the code gives.
+#include "TextArchives.h"
+
 #include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/persistence/Document.h>
-#include <EditorModel/persistence/Json.h>
-
-#include <boost/archive/xml_iarchive.hpp>
-#include <boost/archive/xml_oarchive.hpp>
-#include <boost/serialization/nvp.hpp>
 
 #include <gtest/gtest.h>
 
 #include <QBuffer>
 
-#include <sstream>
-
 namespace {
+
+using namespace GoldenTests;
 
 constexpr const char* xmlArchive = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
 <!DOCTYPE boost_serialization>
@@ -156,34 +153,19 @@ ResourceTable::Object fullTable()
 
 TEST(ResourceDocuments, TheXmlArchiveIsAsWrittenDown)
 {
-    std::ostringstream stream;
-    {
-        const ResourceTable::Object content = fullTable();
-        boost::archive::xml_oarchive archive(stream);
-        archive << BOOST_SERIALIZATION_NVP(content);
-    }
-    EXPECT_EQ(stream.str(), xmlArchive);
+    EXPECT_EQ(saved(fullTable()), xmlArchive);
 
-    std::istringstream stored(xmlArchive);
     ResourceTable::Object content;
-    {
-        boost::archive::xml_iarchive archive(stored);
-        archive >> BOOST_SERIALIZATION_NVP(content);
-    }
+    load(xmlArchive, content);
     EXPECT_TRUE(content == fullTable());
 }
 
 TEST(ResourceDocuments, TheJsonArchiveIsAsWrittenDown)
 {
-    nlohmann::json root;
-    const ResourceTable::Object saved = fullTable();
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", saved);
-    EXPECT_EQ(root, nlohmann::json::parse(jsonArchive));
+    EXPECT_EQ(savedAsJson(fullTable()), nlohmann::json::parse(jsonArchive));
 
-    const auto stored = nlohmann::json::parse(jsonArchive);
     ResourceTable::Object content;
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
+    loadJson(jsonArchive, content);
     EXPECT_TRUE(content == fullTable());
 }
 
@@ -204,13 +186,9 @@ TEST(ResourceDocuments, TheXmlStreamIsAsWrittenDown)
 
 TEST(ResourceDocuments, AnArchiveReplacesTheEntriesOfATableThatItIsReadInto)
 {
-    std::istringstream stored(xmlArchive);
     ResourceTable::Object content;
     content.resource2fileInfo[{QStringLiteral("c"), Resource::AudioType}] = {};
-    {
-        boost::archive::xml_iarchive archive(stored);
-        archive >> BOOST_SERIALIZATION_NVP(content);
-    }
+    load(xmlArchive, content);
     EXPECT_TRUE(content == fullTable());
 }
 

@@ -3,7 +3,7 @@
 // it is the class that goes back.
 #include "FieldRecorder.h"
 #include "FieldTable.h"
-#include "XmlArchives.h"
+#include "TextArchives.h"
 
 #include <EditorModel/EditorModel.h>
 

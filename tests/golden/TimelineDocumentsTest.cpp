@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with a timeline and with a clip look like, written down by hand. Stored data is for life:
 // these texts are never written anew from what the code gives.
-#include "XmlArchives.h"
+#include "TextArchives.h"
 #include "tests/shared/FieldVisitors.h"
 
 #include <EditorModel/analysis/BeatDetection.h>
@@ -11,7 +11,6 @@
 #include <EditorModel/effects/Quiz.h>
 #include <EditorModel/effects/Transition.h>
 #include <EditorModel/media/File.h>
-#include <EditorModel/persistence/Json.h>
 #include <EditorModel/persistence/ObjectTracker.h>
 #include <EditorModel/timeline/Timeline.h>
 
@@ -24,16 +23,6 @@ namespace {
 
 using namespace GoldenTests;
 using Testing::Dump;
-
-const std::string begin = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
-<!DOCTYPE boost_serialization>
-<boost_serialization signature="serialization::archive" version="18">
-<content class_id="0" tracking_level="1" version="0" object_id="_0">)";
-
-const std::string end = R"(</content>
-</boost_serialization>
-
-)";
 
 // Numbers of classes that a document leaves out went to the classes of null pointers.
 
@@ -522,15 +511,10 @@ TEST_F(TimelineDocuments, TheXmlArchiveIsAsWrittenDown)
 
 TEST_F(TimelineDocuments, TheJsonArchiveIsAsWrittenDown)
 {
-    nlohmann::json root;
-    const Timeline::Object& written = m_timeline;
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", written);
-    EXPECT_EQ(root, nlohmann::json::parse(timelineJson));
+    EXPECT_EQ(savedAsJson(m_timeline), nlohmann::json::parse(timelineJson));
 
-    const auto stored = nlohmann::json::parse(timelineJson);
     Timeline::Object content;
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
+    loadJson(timelineJson, content);
     EXPECT_EQ(Dump::of(content), Dump::of(m_timeline));
     freePointees(content);
 }

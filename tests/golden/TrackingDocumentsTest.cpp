@@ -1,21 +1,18 @@
 // SPDX-License-Identifier: Apache-2.0
 // What documents with the data of a tracking look like, written down by hand. Stored data is for life: these
 // texts are never written anew from what the code gives.
+#include "TextArchives.h"
+
 #include <EditorModel/analysis/MotionTracking.h>
 #include <EditorModel/persistence/Document.h>
-#include <EditorModel/persistence/Json.h>
-
-#include <boost/archive/xml_iarchive.hpp>
-#include <boost/archive/xml_oarchive.hpp>
-#include <boost/serialization/nvp.hpp>
 
 #include <gtest/gtest.h>
 
 #include <QBuffer>
 
-#include <sstream>
-
 namespace {
+
+using namespace GoldenTests;
 
 constexpr const char* xmlArchive = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
 <!DOCTYPE boost_serialization>
@@ -124,34 +121,19 @@ void expectTracking(const MotionTracking::Data& data)
 
 TEST(TrackingDocuments, TheXmlArchiveIsAsWrittenDown)
 {
-    std::ostringstream stream;
-    {
-        const MotionTracking::Data content = tracking();
-        boost::archive::xml_oarchive archive(stream);
-        archive << BOOST_SERIALIZATION_NVP(content);
-    }
-    EXPECT_EQ(stream.str(), xmlArchive);
+    EXPECT_EQ(saved(tracking()), xmlArchive);
 
-    std::istringstream stored(xmlArchive);
     MotionTracking::Data content;
-    {
-        boost::archive::xml_iarchive archive(stored);
-        archive >> BOOST_SERIALIZATION_NVP(content);
-    }
+    load(xmlArchive, content);
     expectTracking(content);
 }
 
 TEST(TrackingDocuments, TheJsonArchiveIsAsWrittenDown)
 {
-    nlohmann::json root;
-    const MotionTracking::Data saved = tracking();
-    Serialize::Json::oarchive(root) << boost::serialization::make_nvp("content", saved);
-    EXPECT_EQ(root, nlohmann::json::parse(jsonArchive));
+    EXPECT_EQ(savedAsJson(tracking()), nlohmann::json::parse(jsonArchive));
 
-    const auto stored = nlohmann::json::parse(jsonArchive);
     MotionTracking::Data content;
-    Serialize::Json::iarchive archive(stored);
-    archive >> BOOST_SERIALIZATION_NVP(content);
+    loadJson(jsonArchive, content);
     expectTracking(content);
 }
 
