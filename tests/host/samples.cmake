@@ -54,7 +54,8 @@ sample(tracks.mkv ${first} ${second} ${third} ${fourth} ${fifth} -t 1
     -map 0 -map 2 -map 1 -map 3 -map 4
     -c:v:0 mpeg4 -c:v:1 ffv1 -c:a:0 pcm_s16le -c:a:1 flac -c:a:2 ac3)
 
-# A patch that goes 2 pixels to the right and 1 down with every picture.
+# A patch that goes 2 pixels to the right and 1 down with every picture; in the first it is at (22, 31), since
+# the filter counts from 1.
 sample(patch.mkv -f lavfi -i "color=gray:size=160x120:rate=25"
     -f lavfi -i "testsrc2=size=40x32:rate=25:duration=0.04"
     -filter_complex "overlay=x=20+2*n:y=30+n:format=yuv444" -frames:v 25 -pix_fmt yuv444p -c:v ffv1)

@@ -29,6 +29,17 @@ protected:
         return player;
     }
 
+    static void expectNothingToPlay(const Player& player)
+    {
+        EXPECT_EQ(player.video, nullptr);
+        EXPECT_EQ(player.audio, nullptr);
+        EXPECT_EQ(player.position, nullptr);
+        EXPECT_EQ(player.boundRange, nullptr);
+        EXPECT_EQ(player.state, 0);
+        EXPECT_FALSE(player.busy);
+        EXPECT_FALSE(player.waiting);
+    }
+
     void expectEveryFieldSet(const Player& player) const
     {
         EXPECT_EQ(player.video, &video);
@@ -49,13 +60,7 @@ protected:
 TEST_F(PlaybackTest, StandsStillWithNothingToPlayByDefault)
 {
     const Player player;
-    EXPECT_EQ(player.video, nullptr);
-    EXPECT_EQ(player.audio, nullptr);
-    EXPECT_EQ(player.position, nullptr);
-    EXPECT_EQ(player.boundRange, nullptr);
-    EXPECT_EQ(player.state, 0);
-    EXPECT_FALSE(player.busy);
-    EXPECT_FALSE(player.waiting);
+    expectNothingToPlay(player);
 }
 
 TEST_F(PlaybackTest, SettersStoreAndReturnTheObject)
@@ -72,13 +77,7 @@ TEST_F(PlaybackTest, SettersStoreAndReturnTheObject)
 
     player.setVideo(nullptr)->setAudio(nullptr)->setPosition(nullptr)->setBoundRange(nullptr);
     player.setState(Player::Stopped)->setBusy(false)->setWaiting(false);
-    EXPECT_EQ(player.video, nullptr);
-    EXPECT_EQ(player.audio, nullptr);
-    EXPECT_EQ(player.position, nullptr);
-    EXPECT_EQ(player.boundRange, nullptr);
-    EXPECT_EQ(player.state, 0);
-    EXPECT_FALSE(player.busy);
-    EXPECT_FALSE(player.waiting);
+    expectNothingToPlay(player);
 }
 
 TEST_F(PlaybackTest, PlaysAndStops)

@@ -21,7 +21,7 @@ using testing::HasSubstr;
 using testing::IsEmpty;
 using testing::StartsWith;
 
-/// A project of a patch of 40 x 32 in a picture of 160 x 120, which is at (20 + 2 n, 30 + n) in picture n of
+/// A project of a patch of 40 x 32 in a picture of 160 x 120, which is at (22 + 2 n, 31 + n) in picture n of
 /// 25 in a second, and of a picture.
 class TrackCommand : public testing::Test
 {
@@ -35,7 +35,7 @@ protected:
     }
 
     QString path() const { return m_folder.path("film.json"); }
-    static QStringList patch() { return {"0.125", "0.25", "0.25", "0.266667"}; }
+    static QStringList patch() { return {"0.1375", "0.258334", "0.25", "0.266667"}; }
     Outcome track(const QString& clip, const QStringList& more = patch()) const
     {
         return editormodel(QStringList{"track", path(), clip} + more);
@@ -61,8 +61,8 @@ TEST_F(TrackCommand, FollowsAPatchThroughAClip)
     ASSERT_TRUE(data);
     const auto end = data->findFrame(999, false);
     ASSERT_NE(end, data->frames.end());
-    EXPECT_NEAR(end->second.left, (20 + 2 * 24) / 160.0, 1e-9);
-    EXPECT_NEAR(end->second.top, (30 + 24) / 120.0, 1e-9);
+    EXPECT_NEAR(end->second.left, (22 + 2 * 24) / 160.0, 1e-9);
+    EXPECT_NEAR(end->second.top, (31 + 24) / 120.0, 1e-9);
 }
 
 TEST_F(TrackCommand, FollowsWhatTheClipShowsOfItsSource)
@@ -70,7 +70,7 @@ TEST_F(TrackCommand, FollowsWhatTheClipShowsOfItsSource)
     ASSERT_EQ(editormodel({"edit", path(), "trim-left", "1", "0.2", "then", "trim-right", "1", "0.6"}).errors,
               "");
     // The patch of the sixth picture.
-    const Outcome outcome = track("1", {"0.1875", "0.291667", "0.25", "0.266667", "--id", "part"});
+    const Outcome outcome = track("1", {"0.2", "0.3", "0.25", "0.266667", "--id", "part"});
     EXPECT_THAT(outcome.errors, IsEmpty());
     TrackingStore trackings;
     const ProjectDocument document = ProjectDocument::load(path());
@@ -79,6 +79,8 @@ TEST_F(TrackCommand, FollowsWhatTheClipShowsOfItsSource)
     EXPECT_EQ(data->frames.begin()->first, MTime(200));
     EXPECT_LE(data->frames.rbegin()->first, MTime(600));
     EXPECT_GE(data->frames.rbegin()->first, MTime(560));
+    EXPECT_NEAR(data->frames.begin()->second.left, 32 / 160.0, 1e-9);
+    EXPECT_NEAR(data->frames.at(400).left, (22 + 2 * 10) / 160.0, 1e-9);
 }
 
 TEST_F(TrackCommand, LetsTitlesFollowAndKeepsTheTrackingsOfAPlainDocument)
