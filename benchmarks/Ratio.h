@@ -47,7 +47,8 @@ inline bool compare(const std::string& what, const std::string& subject, const s
     return true;
 }
 
-/// Keeps the shortest time of every benchmark, in nanoseconds of processor time an iteration.
+/// Keeps the shortest time of every benchmark, in nanoseconds an iteration: of processor time, or of what a
+/// benchmark that keeps its own time set.
 class Reporter : public benchmark::ConsoleReporter
 {
 public:
@@ -83,7 +84,9 @@ public:
 private:
     void keepShortest(const Run& run)
     {
-        const double time = run.cpu_accumulated_time * 1e9 / double(run.iterations);
+        const bool ownClock = run.run_name.time_type == "manual_time";
+        const double accumulated = ownClock ? run.real_accumulated_time : run.cpu_accumulated_time;
+        const double time = accumulated * 1e9 / double(run.iterations);
         const auto known = m_times.emplace(run.run_name.str(), time).first;
         known->second = std::min(known->second, time);
     }
