@@ -16,6 +16,7 @@ class EDITORMODEL_EXPORT Object : public Serialize::ISerializable, public virtua
     EDITORMODEL_PERSISTENT(Object)
 
 public:
+    /// Its meaning is a matter of the analysing module: the model stores it and never reads it.
     MTime interval = 2000;
     /// The units of keys and values are a matter of the analysing module.
     std::map<long long, double> beats;

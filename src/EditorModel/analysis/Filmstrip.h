@@ -22,7 +22,8 @@ class EDITORMODEL_EXPORT Object : public virtual PubSub::Object
 {
 public:
     ResourceRef resource;
-    /// In pixels.
+    /// Width and height in pixels; whether of a picture or of the row, those who fill it in and draw it agree
+    /// on.
     int width = 0;
     int height = 0;
     /// The length of the whole source.

@@ -15,6 +15,7 @@ struct EDITORMODEL_EXPORT OverlayLinkInfo
 {
     /// The identifier of the tracking's data.
     QString trackingId;
+    /// From the tracked object. The units are those of whoever plays the overlay; the model never reads it.
     QPointF offset;
     /// For whoever plays the overlay; the model never calls it.
     std::function<void()> callback;

@@ -52,6 +52,7 @@ public:
     MTime maxDuration;
     State state = DefaultState;
     std::set<Range> detectedScenes;
+    /// What these are is a matter of the analysing module.
     std::set<Range> otherScenes;
     /// Not owned.
     const Task::Object* task = nullptr;

@@ -22,9 +22,8 @@ public:
     MTime resourceDuration;
     /// Where in the resource the picture is taken.
     MTime position;
-    /// In pixels.
-    int width = 0;
-    int height = 0;
+    int width = 0;  ///< in pixels
+    int height = 0; ///< in pixels
     /// Null until it is there; copies share it.
     std::shared_ptr<const Types::Image> image;
 

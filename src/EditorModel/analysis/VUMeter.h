@@ -9,7 +9,8 @@
 
 namespace VUMeter {
 
-/// The present levels of a source of sound. They are 0 dB until somebody has measured them.
+/// The present levels of a source of sound. They are 0 dB until somebody has measured them; silence is minus
+/// infinity.
 class EDITORMODEL_EXPORT Object : public virtual PubSub::Object
 {
 public:

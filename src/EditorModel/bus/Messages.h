@@ -29,6 +29,7 @@ class Add : public Request<T>
 public:
     Add(const T* about, T* toOwn) : Request<T>(about), object(toOwn) {}
 
+    /// The sender, for writing.
     T* object;
 };
 
@@ -50,7 +51,7 @@ public:
     using Request<T>::Request;
 };
 
-/// Asks every owner to answer with one Enumerated a object. The sender is null.
+/// Asks every owner to answer with one Enumerated for each object that it owns. The sender is null.
 template <typename T>
 class Enumerate : public Request<T>
 {
@@ -58,6 +59,7 @@ public:
     explicit Enumerate(const T* about = nullptr) : Request<T>(about) {}
 };
 
+/// The sender has an owner from now on.
 template <typename T>
 class Added : public Notification<T>
 {
@@ -76,6 +78,7 @@ public:
     const T* old;
 };
 
+/// The sender's owner lets go of it, and whoever watches it is to do so as well.
 template <typename T>
 class Removed : public Notification<T>
 {

@@ -55,9 +55,11 @@ public:
     /// Ends the sharing of the object. It is to be owned or observed here; null stands for the first one. On
     /// an empty view null reaches nobody.
     void remove(const T* object);
-    /// Drops the object here and tells nobody else. Its owner, if it was this view, is not replaced.
+    /// Drops the object here and tells nobody else. Its owner, if it was this view, is not replaced. The
+    /// callbacks of a departure run for an object that is unknown here, too.
     void forget(const T* object);
-    /// Watches the object. If it was owned here it is only observed afterwards.
+    /// Watches the object, whether or not somebody owns it. One that is here already arrives anew, and is
+    /// only observed afterwards if it was owned here.
     void observe(const T* object);
     /// From here on observes every object that anybody adds, also one that is owned here.
     void observeNew();
@@ -81,6 +83,7 @@ public:
     T* ownerPointer(const T* object);
 
 protected:
+    /// The first call on arrival.
     virtual void added(const T* object);
     /// Called on arrival with a default old value, on change, and on departure with a default new value.
     virtual void changed(const T* object, const T* oldValue, const T* newValue);
@@ -88,6 +91,7 @@ protected:
     virtual void changed(const T* object, const T* oldValue);
     /// Called on arrival, change and departure.
     virtual void changed(const T* object);
+    /// The last call on departure.
     virtual void removed(const T* object);
 
     /// The owner's side of a request. A replacement may adjust or refuse it; to grant it, it ends in a call

@@ -42,21 +42,27 @@ public:
     /// Null for a type that is neither of the two.
     static const QString* mimeType(Type type);
 
-    QString id;       ///< of the effect, as the engine knows it
-    QString uniqueId; ///< of this use of the effect
+    /// Of the effect, as the engine knows it.
+    QString id;
+    /// Tells effects with one `id` apart, as in Timeline::Clip::replaceEffect().
+    QString uniqueId;
     /// The name in the library.
     QString tag;
     QString description;
+    /// The range is the effect's own.
     double intensity = 1.0;
     /// The effect stays in its chain and does nothing.
     bool bypass = false;
 
     Object(const QString& id_ = QString(), const QString& uniqueId_ = QString());
 
+    /// Video here.
     virtual Type type() const;
+    /// DefaultImpl here.
     virtual Impl impl() const;
-    /// Whether `intensity` means anything to the effect.
+    /// Whether `intensity` means anything to the effect; false here.
     virtual bool hasIntensity() const;
+    /// Empty here.
     virtual QString defaultTag() const;
 
     Object* setTag(const QString& newTag);

@@ -31,7 +31,8 @@ struct EDITORMODEL_EXPORT TransformationInterpolator
 {
     /// Interpolates translation, scale, rotation and opacity by themselves; shear and perspective are
     /// dropped. The rotation goes the shorter way round, and backwards where both ways are equal. The opacity
-    /// is rounded, a half upwards.
+    /// is rounded, a half upwards. Not clamped to the two steps; where these are equal the result means
+    /// nothing.
     static Transformation::Object interpolate(double lowerStep, double upperStep, double step,
                                               const Transformation::Object& lower,
                                               const Transformation::Object& upper);
@@ -67,7 +68,7 @@ extern template class Animation::Item<Animation::ValueTypeTrait<Transformation::
 /// envelope, sees no later change and may be called on any thread. A call allocates nothing.
 ///
 /// On the axis of an envelope, 1.0 stands for `total` units of the caller's time. A part of a longer source
-/// starts at `position` and is `length` long; only the ratios of the three count.
+/// starts at `position` and is `length` long; only the ratios of the three count. `total` is not 0.
 namespace Envelope {
 
 /// The gain at a time, from the current time and those at which the played span begins and ends.

@@ -16,7 +16,8 @@
 
 namespace Overlay {
 
-/// The shadow of an overlay's item, in the item's units: off by default, on where a colour is given.
+/// The shadow of an overlay's item: off by default, on where a colour is given. The units of the offsets and
+/// the radius are the rendering module's.
 class EDITORMODEL_EXPORT DropShadow : public Serialize::ISerializable
 {
     EDITORMODEL_PERSISTENT(DropShadow)
@@ -101,6 +102,7 @@ public:
         DefaultType = 0,
     };
 
+    /// "x-application/OverlayPreset-serialized", for the clipboard and for drag and drop.
     static const QString* const mimeType;
 
     Type type = DefaultType;
@@ -111,6 +113,7 @@ public:
     /// The name in the library.
     QString tag;
     QString description;
+    /// Not read by the model.
     MTime sourceDuration;
 
     Preset* setType(Type newType);

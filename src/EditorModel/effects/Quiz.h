@@ -38,6 +38,7 @@ class EDITORMODEL_EXPORT Preset : public Serialize::ISerializable, public virtua
     EDITORMODEL_PERSISTENT(Preset)
 
 public:
+    /// "x-application/QuizPreset-serialized", for the clipboard and for drag and drop.
     static const QString* const mimeType;
 
     std::deque<Question> questions;

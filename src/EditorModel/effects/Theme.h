@@ -22,10 +22,13 @@ public:
     QString tag;
     /// Identifiers of the transitions to use.
     std::deque<QString> transitionsList;
+    /// What the texts of this and the three below name is a matter of whoever makes films of themes: the
+    /// model never reads them.
     QString previewVideo;
     QString music;
     QString startTitle;
     QString finalTitle;
+    /// How long a scene may be. The model enforces nothing of it.
     MTime minSceneDuration = 4000;
     MTime maxSceneDuration = 5000;
 };

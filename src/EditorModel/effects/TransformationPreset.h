@@ -26,8 +26,10 @@ public:
     static const QString* const mimeType;
 
     Type type = Type(0);
+    /// The name in the library.
     QString tag;
     QString description;
+    /// Not read by the model.
     MTime sourceDuration;
     TransformationEnvelope transformation;
 

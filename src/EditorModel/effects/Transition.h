@@ -32,6 +32,7 @@ public:
     };
 
     static constexpr MTime DEFAULT_DURATION = 2000;
+    /// "x-application/TransitionObject-serialized", for the clipboard and for drag and drop.
     static const QString* const mimeType;
 
     QString id;
@@ -48,6 +49,7 @@ public:
 
     Object(const QString& id_ = QString());
 
+    /// Whether `resources` has one of this kind.
     bool hasVideoResources() const;
     bool hasAudioResources() const;
 };

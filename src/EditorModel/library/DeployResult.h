@@ -3,8 +3,8 @@
 
 namespace Package {
 
-/// How the fetching of a package ended. Whoever fetches gives meaning to the other values, which are reached
-/// by a cast.
+/// How the deploying of an import ended. Whoever fetches it gives meaning to the values; all but the default
+/// are reached by a cast.
 enum DeployResult : int
 {
     DefaultDeployResult = 0,

@@ -30,6 +30,7 @@ public:
         DefaultKind = 0,
     };
 
+    /// "x-application/ImportObject-serialized", for the clipboard and for drag and drop.
     static const QString* const mimeType;
 
     /// The name in the library.
@@ -42,7 +43,7 @@ public:
     const Package::InApp::Pack* pack = nullptr;
 
     /// Where the media lies on this machine. Of an item of a pack it is the directory of the pack, which is
-    /// asked for at each call, and is empty as long as nobody has the pack.
+    /// asked for over the bus at each call, and is empty as long as nobody has the pack.
     QString location() const;
     /// Of the item itself; without effect on what an item of a pack answers.
     void setLocation(const QString& location);

@@ -27,7 +27,7 @@ public:
     /// The item. Not owned.
     const Import::Object* import = nullptr;
     Package::DeployResult deployError = Package::DefaultDeployResult;
-    /// Stored as it is given.
+    /// Stored as it is given; the scale is that of the module that fetches.
     double progress = 0.0;
     Stage stage = Initial;
 

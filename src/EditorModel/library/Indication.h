@@ -12,12 +12,13 @@
 
 namespace Indication {
 
-/// The marks on the items of one collection.
+/// The marks on the items of one collection. Items go by the texts that the modules know them by.
 class EDITORMODEL_EXPORT Object : public virtual Serialize::ISerializable, public virtual PubSub::Object
 {
     EDITORMODEL_PERSISTENT(Object)
 
 public:
+    /// Whose marks these are, a collection's or one of IndicationID; the model never reads it.
     QString id;
     std::set<QString> favoriteItems;
     std::set<QString> newItems;

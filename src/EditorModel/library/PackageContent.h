@@ -13,7 +13,7 @@
 
 namespace Package {
 
-/// A file of a package that elements use by its identifier.
+/// A resource of a package: a file, and what it is known by.
 class EDITORMODEL_EXPORT Resource : public Serialize::ISerializable
 {
     EDITORMODEL_PERSISTENT(Resource)

@@ -20,6 +20,7 @@ public:
     explicit GetPackagesRequest(const Package::Object* about = nullptr) : Request(about) {}
 };
 
+/// The answer to GetPackagesRequest. The sender may be null.
 class EDITORMODEL_EXPORT GetPackagesNotification : public ::Message::Types::Notification<Package::Object>
 {
 public:

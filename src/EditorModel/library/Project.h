@@ -53,6 +53,7 @@ namespace ProjectExtraInfo {
 class LoadContext;
 class SaveContext;
 
+/// A project was read. The sender is the application's context.
 class EDITORMODEL_EXPORT ProjectContentLoaded : public Message::Types::Notification<LoadContext>
 {
 public:
@@ -62,6 +63,7 @@ public:
     ~ProjectContentLoaded() override;
 };
 
+/// A project was written. The sender is the application's context.
 class EDITORMODEL_EXPORT ProjectContentSaved : public Message::Types::Notification<SaveContext>
 {
 public:

@@ -52,7 +52,7 @@ public:
     /// Has a colour look-up table made from a file. Where nobody answers, the last answer stands, and at
     /// first that of a new CreateResult.
     CreateResult createLut(const QString& file);
-    /// There is no answer.
+    /// What names a blob is for its keeper to say. There is no answer.
     void loadBlob(const QString& blob);
     /// The paths of all blobs by their identifiers, asked for anew at each call; where nobody answers, those
     /// of the last answer. The reference is valid as long as the helper, and a later call changes what it

@@ -129,6 +129,7 @@ public:
     ~AddMediaFilesResult() override;
 
     FileAdder::AddedResult result;
+    /// Paths, as whoever answers gives them.
     QStringList files;
 };
 

@@ -12,7 +12,7 @@ namespace Media {
 class EDITORMODEL_EXPORT Object : public virtual PubSub::Object
 {
 public:
-    /// Copied with the object; not stored.
+    /// Copied with the object; not stored, and not read by the model.
     QString label;
 
     Object() = default;

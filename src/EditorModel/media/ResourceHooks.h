@@ -152,9 +152,9 @@ class EDITORMODEL_EXPORT Describer
 public:
     Describer(const ResourceRef& ref);
 
-    /// Null where no engine is registered.
+    /// What the engine tells, and owns; null where none is registered.
     const FileInfo* fileInfo() const;
-    /// Null where no engine is registered.
+    /// What the engine tells, and owns; null where none is registered.
     const Composition::Object* composition() const;
     /// A default one where no engine is registered.
     Timing timing() const;

@@ -46,6 +46,7 @@ public:
     };
 
     Mode mode = Described;
+    /// This and the two below are stored and compared; getTimings() doesn't read them.
     MTime intro;
     MTime outro;
     int loopMinCount = 0;

@@ -29,7 +29,8 @@ enum ResizeMode : int
 };
 
 /// A resource that plays on its own, apart from any timeline. Clients fill it in for the module that plays
-/// it. Nothing is checked, nothing that the pointers name is owned, and nothing is stored.
+/// it; the fields are those of Timeline::Clip and Timeline::ClipTiming, in one record. Nothing is checked,
+/// nothing that the pointers name is owned, and nothing is stored.
 class EDITORMODEL_EXPORT Source : public virtual PubSub::Object
 {
 public:

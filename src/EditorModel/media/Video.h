@@ -13,18 +13,17 @@ class EDITORMODEL_EXPORT Video : public Media::Object, public virtual Serialize:
     EDITORMODEL_PERSISTENT(Video)
 
 public:
-    /// In pixels.
-    int width = 1920;
-    int height = 1080;
-    /// Pictures per second, as a fraction.
+    int width = 1920;  ///< in pixels
+    int height = 1080; ///< in pixels
+    /// Pictures per second, as a fraction: `frameRateN` in `frameRateD` seconds.
     int frameRateN = 30000;
     int frameRateD = 1001;
-    /// A pixel's width to its height.
+    /// A pixel's width to its height, as `aspectX` to `aspectY`.
     int aspectX = 1;
     int aspectY = 1;
-    /// Lives in memory only: a loaded record has the default.
+    /// Not read by the model. Lives in memory only: a loaded record has the default.
     bool exportMode = false;
-    /// Lives in memory only: a loaded record has the default.
+    /// Not read by the model. Lives in memory only: a loaded record has the default.
     bool opaque = true;
 
     Video() = default;

@@ -15,7 +15,9 @@ namespace Serialize::Json {
 
 /// Keys of stored data.
 namespace MetaDetails {
+/// The meta node, in the node of an object.
 EDITORMODEL_EXPORT extern const std::string s_meta;
+/// The archive name of the object's class.
 EDITORMODEL_EXPORT extern const std::string s_class_name;
 /// The identity of an object, a number, in the node that it stands in.
 EDITORMODEL_EXPORT extern const std::string s_id;
@@ -48,6 +50,8 @@ EDITORMODEL_EXPORT void load(const nlohmann::json& node, qint64& value);
 
 } // namespace detail
 
+/// Throws `boost::archive::archive_exception` for a pointer to an object whose class is not registered, and
+/// `std::runtime_error` for what cannot be written.
 class EDITORMODEL_EXPORT oarchive : public Details::FieldArchive<oarchive, true>
 {
 public:
@@ -84,6 +88,10 @@ private:
     std::unique_ptr<Writer> m_writer;
 };
 
+/// Throws `boost::archive::archive_exception` for a class that is not registered, `std::out_of_range` for an
+/// identity that no object has, `std::bad_cast` for an object of another class than the pointer's, and
+/// `std::runtime_error` for what else is wrong with the tree. Objects that were made until then are the
+/// caller's, as all that it makes.
 class EDITORMODEL_EXPORT iarchive : public Details::FieldArchive<iarchive, false>
 {
 public:

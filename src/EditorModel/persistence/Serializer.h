@@ -87,6 +87,7 @@ public:
 
     /// Null is allowed. Throws where the object's class is not registered.
     virtual void writePointer(const ISerializable* object) = 0;
+    /// Gives itself.
     virtual ISerializer& writeObject(const ISerializable& object) = 0;
     virtual IFieldStream& stream() = 0;
 };
@@ -98,8 +99,10 @@ public:
     virtual ~IDeserializer();
 
     /// Sets `object` to null, to an object made by the registered creator, or to one read before. An object
-    /// that is still being read, in a cycle, is given with the fields that it has so far.
+    /// that is still being read, in a cycle, is given with the fields that it has so far. What is made
+    /// belongs to whoever reads. Throws where no creator is registered.
     virtual void readPointer(ISerializable*& object) = 0;
+    /// Gives itself.
     virtual IDeserializer& readObject(ISerializable& object) = 0;
     virtual IFieldStream& stream() = 0;
 };

@@ -13,7 +13,7 @@
 namespace Capture {
 
 /// What all recorders have in common. T is the class that derives from it. The setters store what they are
-/// given, and all that returns a T* returns this object.
+/// given, and all that returns a T* returns this object. The model itself reads none of the fields.
 template <typename T>
 class Object : public virtual PubSub::Object
 {
@@ -27,11 +27,11 @@ public:
 
     T* impl();
 
-    /// The same, under the name of a new beginning and of an end.
+    /// Both set Stopped.
     T* reset();
     T* stop();
     T* start();
-    /// What went wrong is told apart, by setErrorString().
+    /// Sets Failed, no more: what went wrong is told by setErrorString().
     T* error();
 
     T* setSourceId(const QString& value);
@@ -87,6 +87,7 @@ class EDITORMODEL_EXPORT CountDown : public virtual PubSub::Object
 public:
     CountDown* setValue(int newValue);
 
+    /// The unit is that of whoever counts.
     int value = 0;
 };
 

@@ -36,9 +36,8 @@ public:
 
     /// Not owned; null if nothing is played.
     const Playback::Object* playback = nullptr;
-    /// In pixels.
-    int width = 0;
-    int height = 0;
+    int width = 0;  ///< in pixels
+    int height = 0; ///< in pixels
     /// Of what the picture leaves free, as ARGB.
     quint32 paddingColor = 0;
     bool fullScreen = false;
@@ -56,7 +55,7 @@ public:
 
     /// Not owned; null if nothing is played.
     const Playback::Object* playback = nullptr;
-    /// 0 is silence, where an output starts.
+    /// 0 is silence, where an output starts; the scale is that of the modules that play.
     double volume = 0.0;
 };
 

@@ -60,24 +60,26 @@ public:
         IntroOverlayClip = 32,
     };
 
-    /// The shortest piece of a clip that an edit may leave: the margin of every cut and transition.
+    /// 10 ms, the shortest piece of a clip that an edit may leave: the margin of every cut and transition.
     static const MTime MIN_DURATION;
-    static const MTime DEFAULT_TITLE_CLIP_DURATION;
-    static const MTime DEFAULT_CALLOUT_CLIP_DURATION;
-    static const MTime DEFAULT_IMAGE_CLIP_DURATION;
-    static const MTime DEFAULT_QUIZ_CLIP_DURATION;
+    static const MTime DEFAULT_TITLE_CLIP_DURATION;   ///< 6000 ms
+    static const MTime DEFAULT_CALLOUT_CLIP_DURATION; ///< 3000 ms
+    static const MTime DEFAULT_IMAGE_CLIP_DURATION;   ///< 4000 ms
+    static const MTime DEFAULT_QUIZ_CLIP_DURATION;    ///< 5500 ms
 
     const Timeline::Object* timeline = nullptr;
     ClipType type{};
     QString name;
-    /// Not stored.
+    /// Not stored, and never read by the model.
     const Composition::Range* range = nullptr;
+    /// This or one of the three below is what the clip shows.
     const Media::File* file = nullptr;
     const Overlay::Preset* overlay = nullptr;
     const Quiz::Preset* quiz = nullptr;
     const Timeline::Object* nestedTimeline = nullptr;
     /// In percent.
     int volume = 100;
+    /// Null for none, as the two below.
     const VolumeEnvelope* volumeEnvelope = nullptr;
     const TransformationEnvelope* cropEnvelope = nullptr;
     const TransformationEnvelope* moveEnvelope = nullptr;
@@ -88,6 +90,7 @@ public:
     std::set<const Timeline::Label*> labels;
     /// The identifiers of the data of trackings in this clip.
     std::set<QString> motionTrackings;
+    /// Stored and never read by the model, as `broken`.
     bool enabled = true;
     bool broken = false;
     /// The clip may be longer than its source.
@@ -138,7 +141,7 @@ public:
 
     Clip* addLabel(const Timeline::Label* label);
     Clip* removeLabel(const Timeline::Label* label);
-    /// The labels that `other` does not have, by address.
+    /// The labels that `other`, which is not null, does not have, by address.
     std::set<const Timeline::Label*> labelsDifference(const Clip* other) const;
 
     Clip* addMotionTracking(const QString& id);

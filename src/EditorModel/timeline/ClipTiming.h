@@ -89,16 +89,17 @@ public:
     /// stays.
     ClipTiming& reverse();
     /// Multiplies the present speed. Duration, stretch and source shrink by `factor`, each rounded by itself;
-    /// start, transitions and fades stay.
+    /// start, transitions and fades stay. What a factor of 0 makes of them is told at MTime::divRound().
     ClipTiming& speedUp(double factor);
 
     /// The position in the source, in its native time, at a time of the timeline. Not clamped: a time outside
     /// the clip gives a position outside the stretch. `nativeDuration` is the length of the whole source.
+    /// Neither it nor `sourceDuration` is to be 0: the result means nothing then.
     MTime mapToSource(MTime time, MTime nativeDuration) const;
     /// The same by `clip->sourceDuration`; nothing else of the clip counts.
     MTime mapToSource(MTime time, const Timeline::Clip* clip) const;
     /// The time of the timeline at which a position in the source, in its native time, is shown: the inverse
-    /// of mapToSource(), but for rounding. Not clamped.
+    /// of mapToSource(), but for rounding. Not clamped; the clip's `sourceDuration` is not to be 0.
     MTime mapToTimeline(MTime sourceTime, const Timeline::Clip* clip) const;
 };
 

@@ -22,6 +22,7 @@ struct Object;
 /// What markers and ranges have in common.
 struct EDITORMODEL_EXPORT Child : public virtual PubSub::Object
 {
+    /// The composition that it belongs to, or null. Adding it there doesn't set this.
     const Composition::Object* parent = nullptr;
 
     Child() = default;
@@ -30,9 +31,11 @@ struct EDITORMODEL_EXPORT Child : public virtual PubSub::Object
     ~Child() override;
 };
 
+/// A position in the media object.
 struct EDITORMODEL_EXPORT Marker : public Child
 {
     MTime position;
+    /// Not read by the model.
     bool user = false;
 
     Marker() = default;
@@ -47,6 +50,7 @@ struct EDITORMODEL_EXPORT Marker : public Child
 /// A half-open span [from, to) on a level. It has no parent until it is given one.
 struct EDITORMODEL_EXPORT Range : public Child, public Types::Range
 {
+    /// Compared, and otherwise not read by the model, as `zValue`.
     int level = 0;
     int zValue = 0;
 
@@ -71,6 +75,7 @@ EDITORMODEL_EXPORT bool operator!=(const Range& a, const Range& b);
 /// By `from`, `to`, `level` and `zValue`, in this order.
 EDITORMODEL_EXPORT bool operator<(const Range& a, const Range& b);
 
+/// The outline, with the current one of each kind. Every operation that changes it returns it, for chains.
 struct EDITORMODEL_EXPORT Object : public virtual PubSub::Object
 {
     std::set<const Composition::Marker*> markers;

@@ -37,7 +37,7 @@ struct EDITORMODEL_EXPORT Object : public virtual Serialize::ISerializable, publ
     EDITORMODEL_PERSISTENT(Object)
 
 public:
-    /// The shortest that a film is to be. The film itself doesn't enforce it.
+    /// 5000 ms, the shortest that a film is to be. The film itself doesn't enforce it.
     static const MTime MIN_DURATION;
 
     /// From master to slave: a master has one slave.

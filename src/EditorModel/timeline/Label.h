@@ -20,6 +20,7 @@ struct EDITORMODEL_EXPORT Label : public virtual PubSub::Object, public virtual 
 public:
     /// Not owned.
     const Timeline::Object* timeline = nullptr;
+    /// In a time that the modules agree on: the model stores and compares it, no more.
     MTime position;
     QString name;
 

@@ -17,7 +17,9 @@ struct EDITORMODEL_EXPORT Link : public virtual Serialize::ISerializable
 public:
     /// Not owned.
     const Timeline::Clip* master = nullptr;
-    MTime offset; ///< from the start of the master to that of the slave, in the time of the timeline
+    /// How far the slave is from its master, as the modules measure it: the model stores and compares it, no
+    /// more.
+    MTime offset;
 
     /// No link yet, for one that is read.
     Link() = default;

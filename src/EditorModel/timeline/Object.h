@@ -86,6 +86,7 @@ public:
     Scope scope = DefaultScope;
     QString reservedText;
     const Composition::Object* composition = nullptr;
+    /// Not read by the model.
     bool markerUpdateEnabled = true;
     std::map<const Clip*, ClipTiming> clips;
     /// By slave; the link names the master.
@@ -95,7 +96,7 @@ public:
     /// The length of a transition stands in the timings of its clips.
     std::map<const Transition::Object*, ClipPair> transitions;
     std::deque<const Track*> tracks;
-    /// Live in memory only, as do the next two.
+    /// Ranges of the composition that are to be exported. Live in memory only, as do the next two.
     std::set<const Composition::Range*> exportRanges;
     qint64 reservedFirst = 0;
     qint64 reservedSecond = 0;
@@ -131,7 +132,8 @@ public:
     Object* setClipTrackLevel(const Clip* clip, int level);
     Object* setClipSpeedCompensated(const Clip* clip, bool on);
     /// The speed is absolute: 1 plays the source as it is. Scales the duration and the place in the source;
-    /// start, transitions and fades stay. The clip must not be null.
+    /// start, transitions and fades stay. The clip must not be null, and neither its source duration nor that
+    /// of its timing 0.
     Object* setClipSpeed(const Clip* clip, double speed);
 
     /// False on a native audio track and for clips of the three intro types. Strict.
@@ -188,11 +190,12 @@ public:
     const ClipTiming& clipTiming(const Clip* clip) const;
     /// The clip is on the timeline. Lenient.
     bool contains(const Clip* clip) const;
-    /// 1 where the source plays as it is. Strict; the clip must not be null.
+    /// 1 where the source plays as it is, 2 where it plays twice as fast; infinite or not-a-number where the
+    /// timing's source duration is 0. Strict; the clip must not be null.
     double clipSpeed(const Clip* clip) const;
     /// The clips with at least one of the type bits in `mask`.
     std::set<const Clip*> clipsByType(int mask) const;
-    /// The clips that are here and not in `other`, by address; timings are not compared.
+    /// The clips that are here and not in `other`, which is not null, by address; timings are not compared.
     std::set<const Clip*> clipsDifference(const Object* other) const;
     std::set<const Clip*> clipsAt(const Track* track) const;
     /// The clips of the track with `time` in [start, end): unlike in ClipTiming::contains(), the end is open.

@@ -33,7 +33,9 @@ public:
     bool hidden = false;
     /// Tells the linked audio track from the detached one.
     bool linked = false;
+    /// Stored and compared, no more.
     bool gapless = false;
+    /// What Timeline::Object::findUsedTracks() goes by.
     bool used = true;
     /// The timeline that holds the track; not owned. Orders of clips find the track's index through it.
     const Timeline::Object* timeline = nullptr;

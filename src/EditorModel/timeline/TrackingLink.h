@@ -42,6 +42,8 @@ struct EDITORMODEL_EXPORT TrackingLinkInfo : public virtual Serialize::ISerializ
 
 public:
     Timeline::TrackedObject trackedObject;
+    /// From the tracked object. The units are those of the modules: the model stores and compares it, no
+    /// more.
     QPointF objectRelativeOffset;
 
     TrackingLinkInfo() = default;

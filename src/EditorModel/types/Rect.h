@@ -6,7 +6,7 @@
 
 namespace Types {
 
-/// A rectangle by its four edges.
+/// A rectangle by its four edges, in the units of whoever holds it. Nothing keeps them in order.
 class EDITORMODEL_EXPORT Rect : public Serialize::ISerializable
 {
     EDITORMODEL_PERSISTENT(Rect)
