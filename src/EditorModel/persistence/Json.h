@@ -90,8 +90,8 @@ private:
 
 /// Throws `boost::archive::archive_exception` for a class that is not registered, `std::out_of_range` for an
 /// identity that no object has, `std::bad_cast` for an object of another class than the pointer's, and
-/// `std::runtime_error` for what else is wrong with the tree. Objects that were made until then are the
-/// caller's, as all that it makes.
+/// `std::runtime_error` for what else is wrong with the tree. What it makes is the caller's; what no pointer
+/// names yet when it throws is freed by Document::load() alone.
 class EDITORMODEL_EXPORT iarchive : public Details::FieldArchive<iarchive, false>
 {
 public:
