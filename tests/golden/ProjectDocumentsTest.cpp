@@ -5,7 +5,6 @@
 
 #include <EditorModel/library/EditorCollection.h>
 #include <EditorModel/library/ImportObject.h>
-#include <EditorModel/library/Indication.h>
 #include <EditorModel/library/PersistentItem.h>
 #include <EditorModel/library/Project.h>
 #include <EditorModel/media/ResourceTable.h>
@@ -55,31 +54,6 @@ constexpr const char* project = R"(<?xml version="1.0" encoding="UTF-8" standalo
 		</resource2fileInfo>
 	</resourceTable>
 	<portable>1</portable>
-</content>
-</boost_serialization>
-
-)";
-
-constexpr const char* indication = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
-<!DOCTYPE boost_serialization>
-<boost_serialization signature="serialization::archive" version="18">
-<content class_id="0" tracking_level="1" version="0" object_id="_0">
-	<id>Effects</id>
-	<favoriteItems class_id="1" tracking_level="0" version="0">
-		<count>1</count>
-		<item_version>0</item_version>
-		<item>blur</item>
-	</favoriteItems>
-	<newItems>
-		<count>2</count>
-		<item_version>0</item_version>
-		<item>glow</item>
-		<item>haze</item>
-	</newItems>
-	<knownItems>
-		<count>0</count>
-		<item_version>0</item_version>
-	</knownItems>
 </content>
 </boost_serialization>
 
@@ -154,20 +128,6 @@ TEST(ProjectDocuments, TheXmlArchiveIsAsWrittenDown)
     EXPECT_THAT(readCollection->items, ElementsAre(readSong.get(), readSong.get(), nullptr));
     EXPECT_EQ(readSong->tag, "Song");
     EXPECT_EQ(readSong->remoteSize(), 5000000000);
-}
-
-TEST(IndicationDocuments, TheXmlArchiveIsAsWrittenDown)
-{
-    Indication::Object written;
-    written.setId("Effects").setFavorite("blur", true).setNew("haze", true).setNew("glow", true);
-    EXPECT_EQ(saved(written), indication);
-
-    Indication::Object read;
-    load(indication, read);
-    EXPECT_EQ(read.id, "Effects");
-    EXPECT_THAT(read.favoriteItems, ElementsAre("blur"));
-    EXPECT_THAT(read.newItems, ElementsAre("glow", "haze"));
-    EXPECT_THAT(read.knownItems, IsEmpty());
 }
 
 TEST(PersistentItemDocuments, TheXmlArchiveIsAsWrittenDown)
