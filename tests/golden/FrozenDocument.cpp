@@ -14,6 +14,11 @@ namespace {
 
 const std::filesystem::path folder = GOLDEN_DOCUMENTS;
 
+std::string folderOf(Document::Route route)
+{
+    return route == Document::Archive ? "archive/" : "stream/";
+}
+
 std::string endingOf(Document::Form form)
 {
     return form == Document::Xml ? ".xml" : form == Document::Json ? ".json" : ".hex";
@@ -23,7 +28,7 @@ std::string textOf(const std::filesystem::path& path)
 {
     std::ifstream file(path, std::ios::binary);
     if (!file)
-        throw std::runtime_error("there is no frozen document " + path.filename().string());
+        throw std::runtime_error("there is no frozen document " + path.string());
     std::ostringstream text;
     text << file.rdbuf();
     return text.str();
@@ -107,24 +112,32 @@ std::string byteDifference(const std::string& listing, const QByteArray& stored,
 
 } // namespace
 
-std::string FrozenDocument::fileOf(const std::string& name, Document::Form form)
+const std::vector<Way> allWays = {
+    {Document::Archive, Document::Xml},    {Document::Archive, Document::Json},
+    {Document::Archive, Document::Binary}, {Document::Stream, Document::Xml},
+    {Document::Stream, Document::Json},    {Document::Stream, Document::Binary},
+};
+
+std::string FrozenDocument::fileOf(const std::string& name, const Way& way)
 {
     std::string file = name;
     for (std::size_t colons = 0; (colons = file.find("::", colons)) != std::string::npos;)
         file.replace(colons, 2, ".");
-    return file + endingOf(form);
+    return folderOf(way.route) + file + endingOf(way.form);
 }
 
 std::set<std::string> FrozenDocument::files()
 {
     std::set<std::string> names;
-    for (const auto& entry : std::filesystem::directory_iterator(folder))
-        names.insert(entry.path().filename().string());
+    for (const Document::Route route : {Document::Archive, Document::Stream}) {
+        for (const auto& entry : std::filesystem::directory_iterator(folder / folderOf(route)))
+            names.insert(folderOf(route) + entry.path().filename().string());
+    }
     return names;
 }
 
-FrozenDocument::FrozenDocument(const std::string& name, Document::Form aForm)
-    : form(aForm), text(textOf(folder / fileOf(name, aForm)))
+FrozenDocument::FrozenDocument(const std::string& name, const Way& way)
+    : form(way.form), text(textOf(folder / fileOf(name, way)))
 {
     if (form != Document::Binary) {
         bytes = QByteArray::fromStdString(text);

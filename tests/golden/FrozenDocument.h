@@ -9,29 +9,40 @@
 
 #include <set>
 #include <string>
+#include <vector>
 
 namespace GoldenTests {
 
-/// The documents that are kept beside the tests, each as `NAME.xml`, `NAME.json` and `NAME.hex`: a binary
-/// document, byte by byte, with what the bytes stand for behind a `#`. They are for life.
+/// How a document is stored.
+struct Way
+{
+    Document::Route route;
+    Document::Form form;
+};
+
+extern const std::vector<Way> allWays;
+
+/// The documents that are kept beside the tests, in a folder a route, each as `NAME.xml`, `NAME.json` and
+/// `NAME.hex`: a binary document, byte by byte, with what the bytes stand for behind a `#`. They are for
+/// life.
 struct FrozenDocument
 {
     /// With a '.' for every "::" of a class.
-    static std::string fileOf(const std::string& name, Document::Form form);
+    static std::string fileOf(const std::string& name, const Way& way);
     /// The names of all files there are.
     static std::set<std::string> files();
 
     /// Throws `std::runtime_error` where there is no such document.
-    FrozenDocument(const std::string& name, Document::Form form);
+    FrozenDocument(const std::string& name, const Way& way);
 
-    /// What differs first between the document and `bytes`, in words; empty where they say the same. Json has
-    /// no order of members and no blanks, the other forms are compared to the byte.
-    std::string difference(const QByteArray& bytes) const;
+    /// What differs first between the document and `written`, in words; empty where they say the same. Json
+    /// has no order of members and no blanks, the other forms are compared to the byte.
+    std::string difference(const QByteArray& written) const;
 
-    Document::Form form;
     QByteArray bytes;
 
 private:
+    Document::Form form;
     std::string text;
 };
 
