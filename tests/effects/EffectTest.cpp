@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/archives/Forms.h"
 #include "tests/shared/FieldTexts.h"
+#include "tests/shared/VirtualSlots.h"
 
 #include <EditorModel/effects/Effect.h>
 #include <EditorModel/persistence/Fields.h>
@@ -85,22 +86,17 @@ TEST(Effect, AModuleReplacesTheAnswers)
 
 #if defined(__GXX_ABI_VERSION)
 
-/// Modules that were built apart meet in this table: behind the destructor's two entries and the three of the
-/// persistent root come the four queries.
+/// Behind the destructor and the three of the persistent root: the four queries.
 TEST(Effect, ItsVirtualFunctionsKeepTheirPlaces)
 {
+    using Testing::callSlot;
     const Speech speech;
-    const auto* const effect = static_cast<const Effect::Object*>(&speech);
-    const auto slot = [effect](int index, auto* function) {
-        using Function = decltype(function);
-        return (*reinterpret_cast<Function* const*>(effect))[index](effect);
-    };
-    using Query = const Effect::Object*;
-    EXPECT_EQ(slot(2, static_cast<std::string (*)(Query)>(nullptr)), "EffectTests::Speech");
-    EXPECT_EQ(slot(5, static_cast<Effect::Object::Type (*)(Query)>(nullptr)), 1);
-    EXPECT_EQ(slot(6, static_cast<Effect::Object::Impl (*)(Query)>(nullptr)), 7);
-    EXPECT_EQ(slot(7, static_cast<bool (*)(Query)>(nullptr)), true);
-    EXPECT_EQ(slot(8, static_cast<QString (*)(Query)>(nullptr)), "Voice");
+    const Effect::Object* const effect = &speech;
+    EXPECT_EQ(callSlot<std::string>(effect, 2), "EffectTests::Speech");
+    EXPECT_EQ(callSlot<Effect::Object::Type>(effect, 5), 1);
+    EXPECT_EQ(callSlot<Effect::Object::Impl>(effect, 6), 7);
+    EXPECT_EQ(callSlot<bool>(effect, 7), true);
+    EXPECT_EQ(callSlot<QString>(effect, 8), "Voice");
 }
 
 #endif

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/shared/FieldTexts.h"
+#include "tests/shared/VirtualSlots.h"
 
 #include <EditorModel/media/FileAnalyzer.h>
 
@@ -295,5 +296,29 @@ TEST(FileAnalyzerView, HasTheOperationsOfAViewUnderItsPrefix)
     observer.fileAnalyzerForget(&object);
     EXPECT_THAT(observer.fileAnalyzers(), IsEmpty());
 }
+
+#if defined(__GXX_ABI_VERSION)
+
+/// Behind the five of a typed view, of which the first is in slot 10: status, cancelled, processed.
+TEST(FileAnalyzerView, ItsVirtualFunctionsKeepTheirPlaces)
+{
+    using Testing::callSlot;
+    Object object;
+    object.setStatus(Processed);
+    const Object before;
+    const auto* const constObject = &object;
+    Module module;
+    FileAnalyzer::View* const view = &module;
+    callSlot<void>(view, 10, constObject);
+    callSlot<void>(view, 15, constObject, Processing);
+    callSlot<void>(view, 16, constObject);
+    callSlot<void>(view, 17, constObject);
+    EXPECT_EQ(module.take(), Lines({"added 2", "status 1, now 2", "cancelled 2", "processed 2"}));
+    // The replaced callback stands where every typed view has it.
+    callSlot<void>(view, 12, constObject, &before, constObject);
+    EXPECT_EQ(module.take(), Lines({"changed 0 to 2", "status 0, now 2", "processed 2"}));
+}
+
+#endif
 
 } // namespace

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Engine.h"
+#include "tests/shared/VirtualSlots.h"
 
 #include <EditorModel/media/Media.h>
 #include <EditorModel/timeline/Composition.h>
@@ -9,6 +10,7 @@
 #include <optional>
 #include <stdexcept>
 #include <type_traits>
+#include <vector>
 
 namespace {
 
@@ -126,6 +128,45 @@ TEST(DescribingEngine, AFailureOfItsReachesTheAskerAndLeavesTheHookUsable)
     EXPECT_THROW(describedPath(), std::runtime_error);
     EXPECT_EQ(describedPath(), "/first");
 }
+
+#if defined(__GXX_ABI_VERSION)
+
+/// Behind the destructor: file, composition, timing.
+TEST(DescribingEngine, ItsVirtualFunctionsKeepTheirPlaces)
+{
+    using Testing::callSlot;
+    const Composition::Object outline;
+    DescribingEngine engine;
+    engine.outline = &outline;
+    const Resource::Details::Describer* const base = &engine;
+    const Resource::Describer asker({"abc", AudioType});
+    EXPECT_EQ(callSlot<const FileInfo*>(base, 2, &asker), &engine.info);
+    EXPECT_EQ(callSlot<const Composition::Object*>(base, 3, &asker), &outline);
+    EXPECT_EQ(callSlot<Timing>(base, 4, &asker).loopMinCount, 5);
+}
+
+/// Behind the destructor: blob, image, audio, video.
+TEST(LoadingEngine, ItsVirtualFunctionsKeepTheirPlaces)
+{
+    using Testing::callSlot;
+    LoadingEngine engine;
+    Resource::Details::Provider* const base = &engine;
+    const QString id = "abc";
+    const void* const noSettings = nullptr;
+    const auto loaded = [&] {
+        return std::vector<int>{engine.blobs, engine.images, engine.audios, engine.videos};
+    };
+    callSlot<std::unique_ptr<const Blob>>(base, 2, &id, noSettings);
+    EXPECT_EQ(loaded(), std::vector<int>({1, 0, 0, 0}));
+    callSlot<std::unique_ptr<const Image>>(base, 3, &id, noSettings);
+    EXPECT_EQ(loaded(), std::vector<int>({1, 1, 0, 0}));
+    callSlot<std::unique_ptr<const Audio>>(base, 4, &id, noSettings);
+    EXPECT_EQ(loaded(), std::vector<int>({1, 1, 1, 0}));
+    callSlot<std::unique_ptr<const Video>>(base, 5, &id, noSettings);
+    EXPECT_EQ(loaded(), std::vector<int>({1, 1, 1, 1}));
+}
+
+#endif
 
 TEST(Provider, GivesNothingWhereNoEngineIsRegistered)
 {
