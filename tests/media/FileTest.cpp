@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include <EditorModel/media/Media.h>
+#include <EditorModel/persistence/Document.h>
 #include <EditorModel/timeline/Composition.h>
+
+#include <QBuffer>
 
 #include <gmock/gmock.h>
 
@@ -277,6 +280,37 @@ TEST(MediaFileTrack, CopiesWholeWithItsPicture)
     assigned = itself;
     expectWhole(assigned);
     expectWhole(Track::Video(std::move(assigned)));
+}
+
+/// In the form that is given, with the text of its file replaced.
+Document::Graph trackWithFile(Document::Form form, Document::Route route, const char* oldText,
+                              const char* newText)
+{
+    Track track;
+    track.index = 3;
+    QBuffer buffer;
+    buffer.open(QIODevice::ReadWrite);
+    Document::save(buffer, track, form, route);
+    EXPECT_EQ(buffer.data().count(oldText), 1) << buffer.data().toStdString();
+    buffer.buffer().replace(oldText, newText);
+    buffer.seek(0);
+    return Document::load(buffer);
+}
+
+TEST(MediaFileTrack, ReadsAnObjectThatIsNoFileAsNone)
+{
+    const auto archive = trackWithFile(Document::Json, Document::Archive, R"("file": null)",
+                                       R"("file": {"$meta": {"class": "Resource::Timing", "id": 9},
+                                       "mode": 0, "intro": 0, "outro": 0, "loopMinCount": 0})");
+    const auto stream = trackWithFile(Document::Xml, Document::Stream, R"(<file null="true"/>)",
+                                      R"(<file class="Resource::Timing" id="9"><mode>0</mode><intro>0</intro>
+                                      <outro>0</outro><loopMinCount>0</loopMinCount></file>)");
+    for (const Document::Graph* const graph : {&archive, &stream}) {
+        const Track* const loaded = graph->rootAs<Track>();
+        ASSERT_NE(loaded, nullptr);
+        EXPECT_EQ(loaded->file, nullptr);
+        EXPECT_EQ(loaded->index, 3);
+    }
 }
 
 } // namespace

@@ -12,6 +12,7 @@
 #include <future>
 #include <optional>
 #include <thread>
+#include <utility>
 #include <vector>
 
 namespace {
@@ -158,6 +159,15 @@ TEST(ResourceHooksThreads, AnEngineLeavesOnlyBetweenAnswers)
     EXPECT_EQ(describedPath(), "");
 }
 
+template <class Provider>
+void expectToBecomeEmpty(const Provider& provider)
+{
+    const auto deadline = std::chrono::steady_clock::now() + 60s;
+    while (provider.resource() && std::chrono::steady_clock::now() < deadline)
+        std::this_thread::yield();
+    EXPECT_FALSE(provider.resource());
+}
+
 TEST(ResourceHooksThreads, TheFourHooksOfAProviderAreEmptiedOneAfterTheOther)
 {
     LoadingEngine engine;
@@ -166,15 +176,43 @@ TEST(ResourceHooksThreads, TheFourHooksOfAProviderAreEmptiedOneAfterTheOther)
     engine.onNextAudio = [&] {
         leaving = std::async(std::launch::async, [&] { copy.reset(); });
         // The video hook is emptied and let go of, and then the audio hook is waited for.
-        const auto deadline = std::chrono::steady_clock::now() + 60s;
-        while (VideoProvider("d", nullptr).resource() && std::chrono::steady_clock::now() < deadline)
-            std::this_thread::yield();
-        EXPECT_FALSE(VideoProvider("d", nullptr).resource());
+        expectToBecomeEmpty(VideoProvider("d", nullptr));
         EXPECT_TRUE(isHeldBack(leaving));
         EXPECT_TRUE(ImageProvider("c", nullptr).resource());
         EXPECT_TRUE(BlobProvider("b", nullptr).resource());
     };
     EXPECT_TRUE(AudioProvider("a", nullptr).resource());
+    leaving.get();
+    EXPECT_EQ(loadingEngines(), "- - - -");
+}
+
+/// Does what the test wants of it while it loads an image.
+class ImageEngine : public LoadingEngine
+{
+public:
+    std::unique_ptr<const Resource::Image> imageResource(const QString& id,
+                                                         const Types::Image* settings) override
+    {
+        if (const auto action = std::exchange(onNextImage, nullptr))
+            action();
+        return LoadingEngine::imageResource(id, settings);
+    }
+
+    std::function<void()> onNextImage;
+};
+
+TEST(ResourceHooksThreads, TheImageHookOfAProviderIsEmptiedBehindTheAudioHookAndInFrontOfTheBlobHook)
+{
+    ImageEngine engine;
+    std::optional<LoadingEngine> copy(engine);
+    std::future<void> leaving;
+    engine.onNextImage = [&] {
+        leaving = std::async(std::launch::async, [&] { copy.reset(); });
+        expectToBecomeEmpty(AudioProvider("a", nullptr));
+        EXPECT_TRUE(isHeldBack(leaving));
+        EXPECT_TRUE(BlobProvider("b", nullptr).resource());
+    };
+    EXPECT_TRUE(ImageProvider("c", nullptr).resource());
     leaving.get();
     EXPECT_EQ(loadingEngines(), "- - - -");
 }
