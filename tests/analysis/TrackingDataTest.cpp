@@ -205,6 +205,10 @@ TEST(TrackingDataOptimize, JoinsRectanglesThatAreNearlyEqual)
     const auto wide = [](double width) { return Frame(0.1, 0.2, width, 0.4); };
     EXPECT_EQ(optimized({{0, 40, wide(0.3)}, {40, 40, wide(0.3 * (1 + 1e-13))}}), (Spans{{0, 80}}));
     EXPECT_EQ(optimized({{0, 40, wide(0.3)}, {40, 40, wide(0.3 * (1 + 1e-11))}}), (Spans{{0, 40}, {40, 40}}));
+    // What is hardly anything is nearly equal to nothing.
+    const auto at = [](double left) { return Frame(left, 0.2, 0.3, 0.4); };
+    EXPECT_EQ(optimized({{0, 40, at(0)}, {40, 40, at(1e-12)}}), (Spans{{0, 80}}));
+    EXPECT_EQ(optimized({{0, 40, at(0)}, {40, 40, at(1.1e-12)}}), (Spans{{0, 40}, {40, 40}}));
 }
 
 TEST(TrackingDataOptimize, ComparesWithTheFirstRectangleOfTheRun)

@@ -100,6 +100,15 @@ TEST(TransformationInterpolation, TurnsBackwardsByHalfATurn)
     expectMatrix(envelope.valueAt(0.5).matrix, {0, -1, 0, 1, 0, 0, 0, 0, 1});
 }
 
+TEST(TransformationInterpolation, CountsItsAnglesFromZeroToAWholeTurn)
+{
+    // A whole turn is none, and half a turn backwards is one forwards: neither leaves a rest of the sine.
+    const Transform threeQuarters(0, -1, 0, 1, 0, 0, 0, 0, 1);
+    const Transform half(-1, 0, 0, 0, -1, 0, 0, 0, 1);
+    EXPECT_EQ(between(threeQuarters, Transform(), 1).m12, 0.0);
+    EXPECT_EQ(between(Transform(), half, 1).m12, 0.0);
+}
+
 TEST(TransformationInterpolation, ScalesThenTurnsThenMoves)
 {
     // Twice as wide, turned by a quarter, then moved: the x axis ends on (0, 2), the y axis on (-1, 0).

@@ -103,7 +103,12 @@ TEST(PanAndZoom, LeavesAPictureOfTheFramesAspectAsItIs)
     for (const bool fitMode : {true, false}) {
         expectValue(fitted(fitMode, wide, QSize(1280, 720)), {}, {});
         expectValue(fitted(fitMode, square, QSize(1, 1)), {}, {});
+        // Nor where the aspects are 1.1e-13 apart.
+        expectValue(fitted(fitMode, QSize(3000001, 3000000), QSize(3000002, 3000001)), {}, {});
     }
+    // Where they are 4e-12 apart it is fitted: the picture is the wider one.
+    const double ratio = (500001.0 / 500000.0) / (500002.0 / 500001.0);
+    expectValue(fitted(true, QSize(500001, 500000), QSize(500002, 500001)), {ratio, overlap}, {});
 }
 
 TEST(PanAndZoom, LeavesAPictureAsItIsWhereASizeIsEmpty)
