@@ -10,6 +10,8 @@
 #include <gtest/gtest.h>
 
 #include <limits>
+#include <optional>
+#include <string>
 #include <vector>
 
 namespace {
@@ -157,6 +159,38 @@ TEST(JsonArchive, NumbersThatJsonHasNotAreTexts)
     EXPECT_EQ(root, "-inf");
     Serialize::Json::detail::save(root, std::numeric_limits<double>::quiet_NaN());
     EXPECT_EQ(root, "nan");
+}
+
+template <class T>
+void expectNode(const T& value, const json& expected)
+{
+    json node;
+    Serialize::Json::detail::save(node, value);
+    EXPECT_EQ(node, expected);
+    EXPECT_EQ(node.type(), expected.type());
+    T loaded{};
+    Serialize::Json::detail::load(node, loaded);
+    EXPECT_EQ(loaded, value);
+}
+
+TEST(JsonArchive, SingleValuesAreSavedAndLoadedByTheirTypes)
+{
+    expectNode(std::string("four"), "four");
+    expectNode(true, true);
+    expectNode(0.5, 0.5);
+    expectNode(-4, -4);
+    expectNode(4294967295u, 4294967295u);
+    expectNode(qint64(-5000000000), -5000000000);
+}
+
+TEST(JsonArchive, ANodeGivesTheIdentityOfItsObjectOrOfTheOneThatItMentions)
+{
+    using Serialize::Json::getObjectId;
+    EXPECT_EQ(getObjectId(json::parse(R"({"$meta": {"class": "Sample::Leaf", "id": 4}, "number": 4})")), 4u);
+    EXPECT_EQ(getObjectId(json::parse(R"({"$meta": {"ref": 5}})")), 5u);
+    for (const char* const without :
+         {R"({"$meta": {"class": "Sample::Leaf"}})", R"({"id": 4})", "[4]", "4", "null"})
+        EXPECT_EQ(getObjectId(json::parse(without)), std::nullopt) << without;
 }
 
 TEST(JsonArchive, BytesAreBase64)
