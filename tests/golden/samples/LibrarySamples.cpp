@@ -8,11 +8,14 @@
 #include <EditorModel/library/Project.h>
 #include <EditorModel/library/UserObject.h>
 #include <EditorModel/timeline/Timeline.h>
+#include <EditorModel/types/Image.h>
+
+#include <QImage>
 
 namespace GoldenTests {
 namespace {
 
-/// The picture has no pixels, which no library packs in a way of its own.
+/// A picture without pixels is stored in one way; others differ with the library that packs them.
 template <class T>
 T& fillStored(Sample& sample, const QString& collection)
 {
@@ -135,6 +138,19 @@ void fillContent(Sample& sample)
     content.portable = true;
 }
 
+void fillPicture(Sample& sample)
+{
+    QImage image(2, 1, QImage::Format_RGB32);
+    image.setPixelColor(0, 0, QColor(255, 0, 0));
+    image.setPixelColor(1, 0, QColor(0, 0, 255));
+    auto& theme = sample.root<EditorCollection::PersistentItem<Theme::Object>>();
+    theme.uniqueId = "{1}";
+    theme.preview = std::make_shared<const Types::Image>(QPixmap::fromImage(image));
+    auto& quiz = sample.root<EditorCollection::PersistentItem<Quiz::Preset>>();
+    quiz.uniqueId = "{2}";
+    quiz.preview = theme.preview;
+}
+
 } // namespace
 
 void fillSong(Import::Object& song)
@@ -194,6 +210,11 @@ Package::Storage storage()
     weather.collection2tags = {{"Title", {"Sun", "Rain"}}};
     weather.collection2categories = {{"Title", {"Weather"}}};
     return storage;
+}
+
+NamedSample sharedPicture()
+{
+    return {"picture", fillPicture};
 }
 
 std::vector<NamedSample> librarySamples()

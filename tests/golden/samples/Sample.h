@@ -59,5 +59,7 @@ std::vector<NamedSample> timelineSamples();
 
 /// One small project with what is stored beside it.
 NamedSample wholeProject();
+/// A red and a blue pixel, as the preview of two items.
+NamedSample sharedPicture();
 
 } // namespace GoldenTests
