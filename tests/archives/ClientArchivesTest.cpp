@@ -17,6 +17,8 @@
 #include <boost/serialization/string.hpp>
 #include <boost/serialization/vector.hpp>
 
+#include <QByteArray>
+
 #include <gtest/gtest.h>
 
 #include <functional>
@@ -382,6 +384,25 @@ TEST(XmlArchive, ASoftPointerReadsAnotherClassAsNull)
     EXPECT_EQ(loaded.soft, nullptr);
     ASSERT_TRUE(loaded.other);
     EXPECT_TRUE(dynamic_cast<const Sample::Moss*>(loaded.other->anything));
+}
+
+/// Before version 4 of the archives' library, collections had no version of their items.
+TEST(XmlArchive, OfAnEarlyLibraryHasNoVersionsOfItems)
+{
+    Sample::Grove grove;
+    grove.numbers = {7, 8};
+    grove.words = {{QStringLiteral("a")}, {}};
+    grove.grid = {{1, {{2, 0.5}}}};
+    QByteArray early = QByteArray::fromStdString(XmlForm::save(grove));
+    early.replace("<item_version>0</item_version>", "");
+    const int version = early.indexOf("version=\"", early.indexOf("<boost_serialization")) + 9;
+    early.replace(version, early.indexOf('"', version) - version, "3");
+    ASSERT_TRUE(early.contains("signature=\"serialization::archive\" version=\"3\""))
+        << early.left(200).constData();
+    ASSERT_FALSE(early.contains("item_version"));
+    Sample::Grove loaded;
+    XmlForm::load(early.toStdString(), loaded);
+    EXPECT_EQ(Dump::of(loaded), Dump::of(grove));
 }
 
 TEST(JsonArchive, AStrictPointerToAnotherClassThrows)
