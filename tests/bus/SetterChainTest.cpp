@@ -37,6 +37,19 @@ TEST_F(ViewTest, AChainCommitsAtTheEndOfItsStatement)
     EXPECT_EQ(trace.take(), change("owner", "a", 0, 2));
 }
 
+TEST_F(ViewTest, AChainEditsTheValueThatTheObjectHadAtItsBeginning)
+{
+    TracedView owner(trace, "owner");
+    owner.own(&a())->setValue(1);
+    trace.take();
+    {
+        const Chain chain = owner.change(&a());
+        a().setValue(9);
+        EXPECT_EQ(chain->value, 1);
+    }
+    EXPECT_EQ(trace.take(), change("owner", "a", 9, 1));
+}
+
 TEST_F(ViewTest, AMovedChainCommitsOnceWithItsLastValue)
 {
     TracedView owner(trace, "owner");

@@ -69,14 +69,17 @@ TEST_F(ViewTest, ObservingAllGivesUpEverythingThatTheViewOwns)
     EXPECT_THAT(view.enumerateAll(), IsEmpty());
 }
 
-TEST_F(ViewTest, OwningAnObservedObjectMakesItWritable)
+TEST_F(ViewTest, OwningAnObservedObjectMakesItWritableUntilItsOwnAnnouncementComesBack)
 {
     TracedView view(trace, "view");
     view.observe(&a());
     trace.take();
+    std::vector<bool> owned;
+    view.onAdded = [&] { owned.push_back(view.isOwned(&a())); };
     view.own(&a());
-    // Its own announcement comes back to the subscription that observe() made.
+    // It comes back to the subscription that observe() made.
     EXPECT_EQ(trace.take(), arrival("view", "a", 0) + arrival("view", "a", 0));
+    EXPECT_THAT(owned, ElementsAre(true, false));
     EXPECT_FALSE(view.isOwned(&a()));
 }
 

@@ -27,6 +27,10 @@ struct Instance
     using Object = T;
     static_assert(Testing::isVirtualBase<PubSub::Object, T>);
     static_assert((std::is_base_of_v<Message::View<T>, TypedViews> && ...));
+    // The view is out of reach under its own names, and no typed view begins with an object.
+    static_assert((!std::is_convertible_v<TypedViews*, Message::View<T>*> && ...));
+    static_assert((!std::is_constructible_v<TypedViews, const T*> && ...));
+    static_assert((std::is_copy_constructible_v<TypedViews> && ...));
 };
 
 using Instances = testing::Types<
