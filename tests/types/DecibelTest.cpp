@@ -98,6 +98,16 @@ TEST(DecibelEquality, IsRelativeElsewhere)
     EXPECT_FALSE(dB(1.0) == dB(-1.0));
 }
 
+TEST(DecibelEquality, EndsBehindTheLesserMagnitude)
+{
+    // A difference of 1, a million million times, is the lesser of the two.
+    EXPECT_TRUE(dB(1e12) == dB(1e12 + 1));
+    EXPECT_TRUE(dB(-1e12 - 1) == dB(-1e12));
+    // One of 2 is more than it by far, and one of 1 more than 1e12 - 1 by one.
+    EXPECT_FALSE(dB(1e12) == dB(1e12 + 2));
+    EXPECT_FALSE(dB(1e12 - 1) == dB(1e12));
+}
+
 TEST(DecibelEquality, IsNoneForSilence)
 {
     const Decibel silence = Decibel::fromRelativeLevel(0.0);

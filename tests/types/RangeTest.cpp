@@ -125,6 +125,39 @@ TEST(RangeDifference, IsTheRangeItselfWhereTheOtherStandsAside)
     EXPECT_EQ((Ranges{{3, 3}}), Range(3, 3).subsctracted(Range(3, 5)));
 }
 
+// A range whose ends are in the wrong order holds nothing, and yet has a place.
+TEST(RangeOfWrongOrder, IntersectsWhatLiesOverBothOfItsEnds)
+{
+    const Range turned(5, 2);
+    EXPECT_TRUE(turned.hasIntersection(Range(0, 10)));
+    EXPECT_TRUE(Range(0, 10).hasIntersection(turned));
+    EXPECT_EQ(turned, turned.intersection(Range(0, 10)));
+    EXPECT_EQ(turned, Range(0, 10).intersection(turned));
+    EXPECT_EQ((Ranges{{0, 10}}), turned.added(Range(0, 10)));
+    // 5 is not before 10, and 2 not behind 0.
+    EXPECT_FALSE(turned.hasIntersection(Range(0, 5)));
+    EXPECT_FALSE(turned.hasIntersection(Range(2, 9)));
+    EXPECT_EQ(Range(), turned.intersection(turned));
+    EXPECT_EQ((Ranges{{5, 2}}), turned.added(turned));
+}
+
+TEST(RangeOfWrongOrder, LeavesTwoPiecesThatOverlap)
+{
+    EXPECT_EQ((Ranges{{0, 5}, {2, 10}}), Range(0, 10).subsctracted(Range(5, 2)));
+    EXPECT_EQ(Ranges{}, Range(5, 2).subsctracted(Range(0, 10)));
+    EXPECT_EQ((Ranges{{5, 2}}), Range(5, 2).subsctracted(Range(0, 5)));
+}
+
+TEST(RangeOfWrongOrder, ByDefaultIsMetByWhatLiesOverZeroAndTheInstantBefore)
+{
+    EXPECT_TRUE(Range().hasIntersection(Range(-2, 1)));
+    EXPECT_FALSE(Range().hasIntersection(Range(0, 1)));
+    EXPECT_FALSE(Range().hasIntersection(Range(-1, 1)));
+    EXPECT_FALSE(Range().hasIntersection(Range()));
+    EXPECT_EQ((Ranges{{0, -1}}), Range().added(Range()));
+    EXPECT_EQ((Ranges{{0, -1}, {0, 1}}), Range().added(Range(0, 1)));
+}
+
 // The laws are checked point by point over a short line, with the ends in order and points allowed.
 constexpr int LINE = 12;
 

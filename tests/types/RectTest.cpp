@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <functional>
 #include <limits>
 
 namespace {
@@ -23,6 +24,15 @@ TEST(Rect, IsZeroByDefault)
 TEST(Rect, TakesLeftTopRightBottom)
 {
     EXPECT_EQ((std::array<double, 4>{1, 2, 3, 4}), edgesOf(Rect(1, 2, 3, 4)));
+}
+
+TEST(Rect, HoldsItsEdgesInTheOrderOfItsConstructor)
+{
+    const Rect rect;
+    const std::less<const double*> isBefore;
+    EXPECT_TRUE(isBefore(&rect.left, &rect.top));
+    EXPECT_TRUE(isBefore(&rect.top, &rect.right));
+    EXPECT_TRUE(isBefore(&rect.right, &rect.bottom));
 }
 
 TEST(Rect, EqualsWhatDiffersByLessThanItsPrecision)
