@@ -69,6 +69,17 @@ TEST(ObjectTracker, AValueAtTheAddressOfAnObjectOnTheHeapIsRefused)
               "Reference to object on heap is not allowed");
 }
 
+TEST(ObjectTracker, AValueAtTheAddressOfAnObjectHeldByValuePasses)
+{
+    const Sample::Leaf leaf;
+    object_tracker tracker;
+    tracker << make_nvp("leaf", leaf);
+    // Never read, as above.
+    const int& member = *static_cast<const int*>(addressOf(leaf));
+    EXPECT_EQ(messageOf([&] { tracker << make_nvp("member", member); }), "nothing was thrown");
+    EXPECT_EQ(tracker.records().at(addressOf(leaf)).kind, object_tracker::ByReference);
+}
+
 TEST(ObjectTracker, AnObjectMetAgainWhileItIsBeingSavedPasses)
 {
     Sample::Tree tree;
