@@ -215,6 +215,15 @@ TEST_F(Editing, SpeedRoundsEachTimeByItself)
     EXPECT_TRUE(timeline.clipTiming(&clips[0]) == ClipTiming(&tracks[0], 0, 7, 167, 33, 333));
 }
 
+TEST_F(Editing, SpeedIsChangedByItsRatioToThePresentOne)
+{
+    // 2 / (3.0 / 11.0) is just above 22 / 3, so that 11 divided by it falls just short of 1.5.
+    clips[0].setSourceDuration(MTime(3));
+    timeline.addClip(&clips[0], ClipTiming(&tracks[0], 0, 7, 11, 0, 11));
+    timeline.setClipSpeed(&clips[0], 2.0);
+    EXPECT_TRUE(timeline.clipTiming(&clips[0]) == ClipTiming(&tracks[0], 0, 7, 1, 0, 1));
+}
+
 TEST_F(Editing, TimingsOfIntrosAreNotEdited)
 {
     lay(0, 0, 100);
