@@ -1,16 +1,25 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/services/DeviceModule.h"
+#include "tests/shared/FieldTexts.h"
+#include "tests/shared/VirtualSlots.h"
 
 #include <gmock/gmock.h>
 
 #include <functional>
 #include <limits>
+#include <type_traits>
 
 namespace {
 
 using namespace ServicesTests;
 using testing::ElementsAre;
 using testing::IsEmpty;
+
+static_assert(Testing::isVirtualBase<PubSub::Object, AudioOutput>);
+static_assert(Testing::isVirtualBase<PubSub::Object, VideoOutput>);
+static_assert(!std::is_base_of_v<Serialize::ISerializable, AudioOutput>);
+static_assert(!std::is_base_of_v<Serialize::ISerializable, VideoOutput>);
+static_assert(std::is_same_v<decltype(VideoOutput::paddingColor), quint32>);
 
 const double notANumber = std::numeric_limits<double>::quiet_NaN();
 
@@ -350,5 +359,38 @@ TEST(OutputView, OneModuleDealsWithPicturesAndSound)
     player.outputChange(&sound)->setVolume(0.5);
     EXPECT_THAT(player.lines, ElementsAre("-/0/4x3/", "-/0.5"));
 }
+
+#if defined(__GXX_ABI_VERSION)
+
+/// Behind those of a typed view.
+TEST_F(VideoViewTest, ItsVirtualFunctionsKeepTheirPlaces)
+{
+    const VideoOutput output;
+    const VideoOutput* const object = &output;
+    Device::View<VideoOutput>* const view = &m_owner;
+    Testing::callSlot<void>(view, 10, object);
+    Testing::callSlot<void>(view, 15, object, object, object);
+    for (int slot = 16; slot != 21; ++slot)
+        Testing::callSlot<void>(view, slot, object);
+    EXPECT_THAT(take(),
+                ElementsAre("owner: added -/0/0x0/", "owner: playback from -/0/0x0/ to -/0/0x0/ of -/0/0x0/",
+                            "owner: padding -/0/0x0/", "owner: geometry -/0/0x0/",
+                            "owner: fullScreen -/0/0x0/", "owner: initialized -/0/0x0/",
+                            "owner: highQuality -/0/0x0/"));
+}
+
+TEST_F(AudioViewTest, ItsVirtualFunctionsKeepTheirPlaces)
+{
+    const AudioOutput output;
+    const AudioOutput* const object = &output;
+    Device::View<AudioOutput>* const view = &m_owner;
+    Testing::callSlot<void>(view, 10, object);
+    Testing::callSlot<void>(view, 15, object, object, object);
+    Testing::callSlot<void>(view, 16, object);
+    EXPECT_THAT(take(), ElementsAre("owner: added -/0", "owner: playback from -/0 to -/0 of -/0",
+                                    "owner: volume -/0"));
+}
+
+#endif
 
 } // namespace
