@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "FileModule.h"
 
+#include "tests/shared/VirtualSlots.h"
+
 #include <gmock/gmock.h>
 
 namespace {
@@ -233,5 +235,23 @@ TEST(FileView, SortsItsFilesByTheirFlags)
                 ElementsAre(&files[2]));
     EXPECT_THAT(module.filesFiltered([](const Media::File*) { return false; }), IsEmpty());
 }
+
+#if defined(__GXX_ABI_VERSION)
+
+/// Behind those of a typed view.
+TEST(FileView, ItsVirtualFunctionsKeepTheirPlaces)
+{
+    Lines lines;
+    const Media::File file;
+    const Media::File* const object = &file;
+    FileModule module(lines, "module");
+    Media::View<Media::File>* const view = &module;
+    for (const int slot : {10, 15, 16, 17})
+        Testing::callSlot<void>(view, slot, object);
+    EXPECT_THAT(lines, ElementsAre("module: added ---", "module: opened ---", "module: closed ---",
+                                   "module: failed ---"));
+}
+
+#endif
 
 } // namespace
