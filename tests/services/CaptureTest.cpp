@@ -6,7 +6,6 @@
 #include "tests/types/Printing.h"
 
 #include <type_traits>
-#include <utility>
 
 namespace {
 
@@ -70,31 +69,6 @@ public:
     int number = 0;
 };
 
-TEST(AudioCapture, IsEmptyByDefault)
-{
-    const Audio audio;
-    expectEmptyCapture(audio);
-    EXPECT_EQ(audio.quality, 5);
-    EXPECT_EQ(audio.volume, 100);
-    EXPECT_EQ(audio.mode, 0);
-}
-
-TEST(AudioCapture, SettersStoreAndReturnTheObject)
-{
-    Audio audio;
-    EXPECT_EQ(audio.setSourceId("source"), &audio);
-    EXPECT_EQ(audio.setDeviceId("device"), &audio);
-    EXPECT_EQ(audio.setFilePath("/voice.wav"), &audio);
-    EXPECT_EQ(audio.setErrorString("disk full"), &audio);
-    EXPECT_EQ(audio.setDuration(1500), &audio);
-    EXPECT_EQ(audio.setQuality(Audio::Quality(2)), &audio);
-    EXPECT_EQ(audio.setVolume(80), &audio);
-    EXPECT_EQ(audio.setMode(Audio::Mode(3)), &audio);
-    EXPECT_EQ(audio.state, 0);
-    audio.error();
-    expectEveryFieldSet(audio);
-}
-
 TEST(AudioCapture, StartsFailsAndStops)
 {
     Audio audio;
@@ -137,25 +111,6 @@ TEST(AudioCapture, ClearingLeavesTheFieldsOfSoundAlone)
     EXPECT_EQ(audio.mode, 3);
 }
 
-TEST(AudioCapture, CopiesMovesAndAssignsEveryField)
-{
-    const Audio audio = everyFieldSet();
-    Audio copy(audio);
-    expectEveryFieldSet(copy);
-    Audio assigned;
-    EXPECT_EQ(&(assigned = audio), &assigned);
-    expectEveryFieldSet(assigned);
-    const Audio& itself = assigned;
-    assigned = itself;
-    expectEveryFieldSet(assigned);
-    Audio moved(std::move(copy));
-    expectEveryFieldSet(moved);
-    Audio target;
-    EXPECT_EQ(&(target = std::move(moved)), &target);
-    expectEveryFieldSet(target);
-    expectEveryFieldSet(audio);
-}
-
 TEST(AudioCapture, IsChangedThroughItsOwner)
 {
     Audio audio;
@@ -193,33 +148,6 @@ TEST(Capture, IsClearedToTheFieldsOfANewRecorder)
     EXPECT_EQ(screen.sourceId, "");
     EXPECT_EQ(screen.filePath, "/screen.mp4");
     EXPECT_EQ(screen.number, 2);
-}
-
-TEST(CountDown, HoldsItsValue)
-{
-    CountDown countDown;
-    EXPECT_EQ(countDown.value, 0);
-    EXPECT_EQ(countDown.setValue(3), &countDown);
-    EXPECT_EQ(countDown.value, 3);
-    EXPECT_EQ(countDown.setValue(-1)->value, -1);
-}
-
-TEST(CountDown, CopiesMovesAndAssignsItsValue)
-{
-    CountDown countDown;
-    countDown.setValue(3);
-    CountDown copy(countDown);
-    EXPECT_EQ(copy.value, 3);
-    CountDown assigned;
-    EXPECT_EQ(&(assigned = countDown), &assigned);
-    const CountDown& itself = assigned;
-    assigned = itself;
-    EXPECT_EQ(assigned.value, 3);
-    const CountDown moved(std::move(copy));
-    EXPECT_EQ(moved.value, 3);
-    CountDown target;
-    EXPECT_EQ(&(target = std::move(assigned)), &target);
-    EXPECT_EQ(target.value, 3);
 }
 
 TEST(CountDown, CountsForWhoeverWatches)

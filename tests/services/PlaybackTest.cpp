@@ -8,7 +8,6 @@
 #include "tests/shared/FieldTexts.h"
 
 #include <type_traits>
-#include <utility>
 
 namespace {
 
@@ -21,25 +20,6 @@ static_assert(std::is_same_v<std::underlying_type_t<Player::State>, int>);
 class PlaybackTest : public testing::Test
 {
 protected:
-    Player everyFieldSet() const
-    {
-        Player player;
-        player.setVideo(&video)->setAudio(&audio)->setPosition(&position)->setBoundRange(&range);
-        player.setState(Player::State(7))->setBusy(true)->setWaiting(true);
-        return player;
-    }
-
-    static void expectNothingToPlay(const Player& player)
-    {
-        EXPECT_EQ(player.video, nullptr);
-        EXPECT_EQ(player.audio, nullptr);
-        EXPECT_EQ(player.position, nullptr);
-        EXPECT_EQ(player.boundRange, nullptr);
-        EXPECT_EQ(player.state, 0);
-        EXPECT_FALSE(player.busy);
-        EXPECT_FALSE(player.waiting);
-    }
-
     void expectEveryFieldSet(const Player& player) const
     {
         EXPECT_EQ(player.video, &video);
@@ -56,29 +36,6 @@ protected:
     const Composition::Marker position{};
     const Composition::Range range{};
 };
-
-TEST_F(PlaybackTest, StandsStillWithNothingToPlayByDefault)
-{
-    const Player player;
-    expectNothingToPlay(player);
-}
-
-TEST_F(PlaybackTest, SettersStoreAndReturnTheObject)
-{
-    Player player;
-    EXPECT_EQ(player.setVideo(&video), &player);
-    EXPECT_EQ(player.setAudio(&audio), &player);
-    EXPECT_EQ(player.setPosition(&position), &player);
-    EXPECT_EQ(player.setBoundRange(&range), &player);
-    EXPECT_EQ(player.setState(Player::State(7)), &player);
-    EXPECT_EQ(player.setBusy(true), &player);
-    EXPECT_EQ(player.setWaiting(true), &player);
-    expectEveryFieldSet(player);
-
-    player.setVideo(nullptr)->setAudio(nullptr)->setPosition(nullptr)->setBoundRange(nullptr);
-    player.setState(Player::Stopped)->setBusy(false)->setWaiting(false);
-    expectNothingToPlay(player);
-}
 
 TEST_F(PlaybackTest, PlaysAndStops)
 {
@@ -105,24 +62,6 @@ TEST_F(PlaybackTest, TheFlagsAndTheStateAreIndependent)
     player.play()->setBusy(false);
     EXPECT_EQ(player.state, 1);
     EXPECT_TRUE(player.waiting);
-}
-
-TEST_F(PlaybackTest, CopiesMovesAndAssignsEveryField)
-{
-    const Player player = everyFieldSet();
-    Player copy(player);
-    expectEveryFieldSet(copy);
-    Player assigned;
-    EXPECT_EQ(&(assigned = player), &assigned);
-    expectEveryFieldSet(assigned);
-    const Player& itself = assigned;
-    assigned = itself;
-    expectEveryFieldSet(assigned);
-    Player moved(std::move(copy));
-    expectEveryFieldSet(moved);
-    Player target;
-    EXPECT_EQ(&(target = std::move(moved)), &target);
-    expectEveryFieldSet(target);
 }
 
 TEST_F(PlaybackTest, IsChangedThroughItsOwner)
