@@ -10,7 +10,6 @@ namespace {
 
 using testing::ElementsAre;
 using Testing::FieldText;
-using testing::IsEmpty;
 
 static_assert(!Testing::isVirtualBase<Serialize::ISerializable, BeatDetection::Object>);
 static_assert(Testing::isVirtualBase<PubSub::Object, BeatDetection::Object>);
@@ -23,27 +22,6 @@ BeatDetection::Object everyFieldSet()
     BeatDetection::Object object;
     object.setInterval(750)->setBeats(beats);
     return object;
-}
-
-TEST(BeatDetection, HasAnIntervalOfTwoSecondsAndNoBeatsByDefault)
-{
-    const BeatDetection::Object object;
-    EXPECT_EQ(object.interval, MTime(2000));
-    EXPECT_THAT(object.beats, IsEmpty());
-}
-
-TEST(BeatDetection, SettersStoreAndReturnTheObject)
-{
-    BeatDetection::Object object;
-    EXPECT_EQ(object.setInterval(750), &object);
-    EXPECT_EQ(object.setBeats(beats), &object);
-    EXPECT_EQ(object.interval, MTime(750));
-    EXPECT_EQ(object.beats, beats);
-}
-
-TEST(BeatDetection, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
 }
 
 TEST(BeatDetection, IsWrittenWithItsBeatsInTheOrderOfTheirKeys)

@@ -25,59 +25,6 @@ Stabilization::Object everyFieldSet()
     return object;
 }
 
-TEST(Stabilization, HasElevenDefaults)
-{
-    const Stabilization::Object object;
-    EXPECT_EQ(object.shakiness, 5);
-    EXPECT_EQ(object.accuracy, 15);
-    EXPECT_EQ(object.stepsize, 6);
-    EXPECT_EQ(object.smoothing, 15);
-    EXPECT_EQ(object.optzoom, 1);
-    EXPECT_EQ(object.originalVideoStreamIndex, -1);
-    EXPECT_EQ(object.originalAudioStreamIndex, -1);
-    EXPECT_EQ(object.pathOriginal, QString());
-    EXPECT_EQ(object.pathStabilized, QString());
-    EXPECT_EQ(object.sourcePositionOriginal, MTime());
-    EXPECT_EQ(object.sourceDurationOriginal, MTime());
-}
-
-TEST(Stabilization, SettersReturnTheObject)
-{
-    Stabilization::Object object;
-    EXPECT_EQ(object.setShakiness(1), &object);
-    EXPECT_EQ(object.setAccuracy(1), &object);
-    EXPECT_EQ(object.setStepsize(1), &object);
-    EXPECT_EQ(object.setSmoothing(1), &object);
-    EXPECT_EQ(object.setOptzoom(Stabilization::Object::OptimalZooming(0)), &object);
-    EXPECT_EQ(object.setOriginalVideoIndex(1), &object);
-    EXPECT_EQ(object.setOriginalAudioIndex(1), &object);
-    EXPECT_EQ(object.setPathOriginal("x"), &object);
-    EXPECT_EQ(object.setPathStabilized("x"), &object);
-    EXPECT_EQ(object.setSourcePositionOriginal(1), &object);
-    EXPECT_EQ(object.setSourceDurationOriginal(1), &object);
-}
-
-TEST(Stabilization, SettersStore)
-{
-    const Stabilization::Object object = everyFieldSet();
-    EXPECT_EQ(object.shakiness, 10);
-    EXPECT_EQ(object.accuracy, 14);
-    EXPECT_EQ(object.stepsize, 7);
-    EXPECT_EQ(object.smoothing, 30);
-    EXPECT_EQ(object.optzoom, 2);
-    EXPECT_EQ(object.originalVideoStreamIndex, 3);
-    EXPECT_EQ(object.originalAudioStreamIndex, 4);
-    EXPECT_EQ(object.pathOriginal, "shaky.mp4");
-    EXPECT_EQ(object.pathStabilized, "calm.mp4");
-    EXPECT_EQ(object.sourcePositionOriginal, MTime(5000));
-    EXPECT_EQ(object.sourceDurationOriginal, MTime(60000));
-}
-
-TEST(Stabilization, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
-}
-
 TEST(Stabilization, IsWrittenInTheOrderOfItsFields)
 {
     EXPECT_THAT(

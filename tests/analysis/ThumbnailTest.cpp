@@ -10,7 +10,6 @@
 
 #include <functional>
 #include <type_traits>
-#include <utility>
 #include <vector>
 
 namespace {
@@ -30,67 +29,6 @@ Object withEveryFieldSet(const Image& image)
     thumbnail.setResource(film)->setResourceDuration(9000)->setPosition(4500)->setSize(160, 90);
     thumbnail.setImage(image);
     return thumbnail;
-}
-
-void expectEveryFieldSet(const Object& thumbnail, const Image& image)
-{
-    EXPECT_EQ(thumbnail.resource, film);
-    EXPECT_EQ(thumbnail.resourceDuration, MTime(9000));
-    EXPECT_EQ(thumbnail.position, MTime(4500));
-    EXPECT_EQ(thumbnail.width, 160);
-    EXPECT_EQ(thumbnail.height, 90);
-    EXPECT_EQ(thumbnail.image, image);
-}
-
-TEST(Thumbnail, IsOfNothingByDefault)
-{
-    const Object thumbnail;
-    EXPECT_EQ(thumbnail.resource, ResourceRef(QString(), Resource::NoType));
-    EXPECT_EQ(thumbnail.resourceDuration, MTime());
-    EXPECT_EQ(thumbnail.position, MTime());
-    EXPECT_EQ(thumbnail.width, 0);
-    EXPECT_EQ(thumbnail.height, 0);
-    EXPECT_EQ(thumbnail.image, nullptr);
-}
-
-TEST(Thumbnail, SettersStoreAndReturnTheObject)
-{
-    const auto image = std::make_shared<const Types::Image>();
-    Object thumbnail;
-    EXPECT_EQ(thumbnail.setResource(film), &thumbnail);
-    EXPECT_EQ(thumbnail.setResourceDuration(-1), &thumbnail);
-    EXPECT_EQ(thumbnail.setPosition(-2), &thumbnail);
-    EXPECT_EQ(thumbnail.setWidth(-3), &thumbnail);
-    EXPECT_EQ(thumbnail.setHeight(-4), &thumbnail);
-    EXPECT_EQ(thumbnail.width, -3);
-    EXPECT_EQ(thumbnail.height, -4);
-    EXPECT_EQ(thumbnail.setSize(5, 6), &thumbnail);
-    EXPECT_EQ(thumbnail.setImage(image), &thumbnail);
-    EXPECT_EQ(thumbnail.resourceDuration, MTime(-1));
-    EXPECT_EQ(thumbnail.position, MTime(-2));
-    EXPECT_EQ(thumbnail.width, 5);
-    EXPECT_EQ(thumbnail.height, 6);
-    EXPECT_EQ(thumbnail.image, image);
-    expectEveryFieldSet(withEveryFieldSet(image), image);
-}
-
-TEST(Thumbnail, CopiesWholeAndSharesTheImage)
-{
-    const auto image = std::make_shared<const Types::Image>();
-    const Object original = withEveryFieldSet(image);
-    Object copy(original);
-    expectEveryFieldSet(copy, image);
-    Object assigned;
-    EXPECT_EQ(&(assigned = original), &assigned);
-    const Object& itself = assigned;
-    assigned = itself;
-    expectEveryFieldSet(assigned, image);
-    const Object moved(std::move(copy));
-    expectEveryFieldSet(moved, image);
-    Object target;
-    EXPECT_EQ(&(target = std::move(assigned)), &target);
-    expectEveryFieldSet(target, image);
-    expectEveryFieldSet(original, image);
 }
 
 TEST(Thumbnail, EqualsTheOneThatHasItsPictureAlready)

@@ -28,17 +28,10 @@ static_assert(std::is_same_v<decltype(std::declval<Data>().findFrame(MTime(), tr
 const Frame here(0.1, 0.2, 0.3, 0.4);
 const Frame there(0.5, 0.2, 0.3, 0.4);
 
-TEST(TrackingData, IsEmptyAtFirst)
+TEST(TrackingData, IsMadeForAnIdentifierWithoutFrames)
 {
-    EXPECT_EQ(Data().id, QString());
-    EXPECT_TRUE(Data().frames.empty());
     EXPECT_EQ(Data(QStringLiteral("a")).id, QStringLiteral("a"));
     EXPECT_TRUE(Data(QStringLiteral("a")).frames.empty());
-}
-
-TEST(TrackingData, CopiesWhole)
-{
-    Testing::expectWholeCopies(trackingOf({{0, 40, here}, {40, 20, there}}));
 }
 
 TEST(TrackingData, IsMadeByName)

@@ -33,9 +33,8 @@ void expectFields(const Frame& frame, double left, double top, double width, dou
     EXPECT_EQ(frame.height, height);
 }
 
-TEST(TrackingFrame, IsTheWholePictureByDefault)
+TEST(TrackingFrame, IsValidAtFirst)
 {
-    expectFields(Frame(), 0, 0, 1, 1);
     EXPECT_TRUE(Frame().isValid());
     EXPECT_FALSE(Frame().isNull());
 }
@@ -160,11 +159,6 @@ TEST(TrackingFrame, MayBeEqualToAnotherAndLessThanIt)
     EXPECT_TRUE(Frame(0, 0, 1, 1) < Frame(1e-13, 0, 1, 1));
 }
 
-TEST(TrackingFrame, CopiesWhole)
-{
-    Testing::expectWholeCopies(Frame(0.1, 0.2, 0.3, 0.4));
-}
-
 TEST(TrackingFrame, IsMadeByName)
 {
     Testing::expectMadeByName<Frame>("MotionTracking::Frame");
@@ -175,26 +169,12 @@ TEST(TrackingFrame, IsWrittenInTheOrderOfItsFields)
     EXPECT_THAT(Testing::fieldKeys(Frame()), ElementsAre("left", "top", "width", "height"));
 }
 
-TEST(TimedTrackingFrame, IsTheWholePictureForNoTimeByDefault)
-{
-    expectFields(TimedFrame(), 0, 0, 1, 1);
-    EXPECT_EQ(TimedFrame().duration, MTime());
-}
-
 TEST(TimedTrackingFrame, IsComparedWithoutItsDuration)
 {
     TimedFrame longer;
     longer.duration = 40;
     EXPECT_TRUE(longer == TimedFrame());
     EXPECT_FALSE(TimedFrame() < longer);
-}
-
-TEST(TimedTrackingFrame, CopiesWhole)
-{
-    TimedFrame frame;
-    static_cast<Frame&>(frame) = Frame(0.1, 0.2, 0.3, 0.4);
-    frame.duration = 40;
-    Testing::expectWholeCopies(frame);
 }
 
 TEST(TimedTrackingFrame, IsMadeByName)

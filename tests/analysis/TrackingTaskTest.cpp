@@ -7,7 +7,6 @@
 #include <functional>
 #include <string>
 #include <type_traits>
-#include <utility>
 #include <vector>
 
 namespace {
@@ -31,58 +30,10 @@ AnalyzeTask fullTask()
     return task;
 }
 
-void expectFull(const AnalyzeTask& task)
-{
-    EXPECT_EQ(task.resource, video);
-    EXPECT_TRUE(task.initialFrame == Frame(0.1, 0.2, 0.3, 0.4));
-    EXPECT_EQ(task.initialPosition, MTime(150));
-    EXPECT_EQ(task.analyzingRange, Range(100, 200));
-    EXPECT_EQ(task.algorithm, 2);
-}
-
-TEST(TrackingTask, NamesNothingAtFirst)
-{
-    const AnalyzeTask task;
-    EXPECT_EQ(std::get<0>(task.resource), QString());
-    EXPECT_EQ(std::get<1>(task.resource), 0);
-    EXPECT_TRUE(task.initialFrame == Frame(0, 0, 1, 1));
-    EXPECT_EQ(task.initialPosition, MTime());
-    EXPECT_EQ(task.analyzingRange.from, MTime(0));
-    EXPECT_EQ(task.analyzingRange.to, MTime(-1));
-    EXPECT_EQ(task.algorithm, 0);
-}
-
 TEST(TrackingTask, IsEmptyAndNotValidAtFirst)
 {
     EXPECT_TRUE(AnalyzeTask().isEmpty());
     EXPECT_FALSE(AnalyzeTask().isValid());
-}
-
-TEST(TrackingTask, SettersStoreAndReturnTheTask)
-{
-    AnalyzeTask task;
-    EXPECT_EQ(&task.setResource(video), &task);
-    EXPECT_EQ(&task.setInitialFrame(Frame(0.1, 0.2, 0.3, 0.4)), &task);
-    EXPECT_EQ(&task.setInitialPosition(150), &task);
-    EXPECT_EQ(&task.setAnalyzingRange(Range(100, 200)), &task);
-    EXPECT_EQ(&task.setAlgorithm(Algorithm(2)), &task);
-    expectFull(task);
-}
-
-TEST(TrackingTask, CopiesWhole)
-{
-    AnalyzeTask task = fullTask();
-    AnalyzeTask copy(task);
-    expectFull(copy);
-    AnalyzeTask assigned;
-    EXPECT_EQ(&(assigned = task), &assigned);
-    const AnalyzeTask& itself = assigned;
-    assigned = itself;
-    expectFull(assigned);
-    const AnalyzeTask moved(std::move(copy));
-    expectFull(moved);
-    EXPECT_EQ(&(assigned = std::move(task)), &assigned);
-    expectFull(assigned);
 }
 
 struct Change

@@ -7,7 +7,6 @@
 #include <gtest/gtest.h>
 
 #include <type_traits>
-#include <utility>
 
 namespace {
 
@@ -53,64 +52,12 @@ void expectEveryFieldSet(const Object& meter)
     expectMeasured(meter);
 }
 
-TEST(VUMeter, HasTheFirstRoleAndMeasuresNothingByDefault)
-{
-    const Object meter;
-    EXPECT_EQ(meter.sourceID, QString());
-    EXPECT_EQ(meter.role, 1);
-    expectNothingMeasured(meter);
-}
-
 TEST(VUMeter, IsMadeForASourceInARole)
 {
     const Object meter("output", Object::Role(3));
     EXPECT_EQ(meter.sourceID, "output");
     EXPECT_EQ(meter.role, 3);
     expectNothingMeasured(meter);
-}
-
-TEST(VUMeter, SettersStoreAndReturnTheObject)
-{
-    Object meter;
-    EXPECT_EQ(meter.setSourceID("x"), &meter);
-    EXPECT_EQ(meter.setLeftChannelPeakLevel(6.0_dB), &meter);
-    EXPECT_EQ(meter.setRightChannelPeakLevel(6.0_dB), &meter);
-    EXPECT_EQ(meter.setLeftChannelLevel(6.0_dB), &meter);
-    EXPECT_EQ(meter.setRightChannelLevel(6.0_dB), &meter);
-    EXPECT_EQ(meter.setLeftChannelClippingDetected(false), &meter);
-    EXPECT_EQ(meter.setRightChannelClippingDetected(false), &meter);
-    EXPECT_EQ(meter.sourceID, "x");
-    EXPECT_EQ(meter.leftChannelPeakLevel.level(), 6.0);
-    expectEveryFieldSet(withEveryFieldSet());
-}
-
-TEST(VUMeter, EachClippingFlagIsItsOwn)
-{
-    Object meter;
-    meter.setLeftChannelClippingDetected(true);
-    EXPECT_TRUE(meter.leftChannelClippingDetected);
-    EXPECT_FALSE(meter.rightChannelClippingDetected);
-    meter.setRightChannelClippingDetected(true)->setLeftChannelClippingDetected(false);
-    EXPECT_FALSE(meter.leftChannelClippingDetected);
-    EXPECT_TRUE(meter.rightChannelClippingDetected);
-}
-
-TEST(VUMeter, CopiesWhole)
-{
-    const Object original = withEveryFieldSet();
-    Object copy(original);
-    expectEveryFieldSet(copy);
-    Object assigned;
-    EXPECT_EQ(&(assigned = original), &assigned);
-    const Object& itself = assigned;
-    assigned = itself;
-    expectEveryFieldSet(assigned);
-    const Object moved(std::move(copy));
-    expectEveryFieldSet(moved);
-    Object target;
-    EXPECT_EQ(&(target = std::move(assigned)), &target);
-    expectEveryFieldSet(target);
-    expectEveryFieldSet(original);
 }
 
 TEST(VUMeter, CopyingFromAnotherTakesWhatWasMeasuredAndKeepsWhoItIs)

@@ -7,7 +7,6 @@
 #include <gtest/gtest.h>
 
 #include <type_traits>
-#include <utility>
 
 // What an analysing module defines.
 namespace Types {
@@ -24,47 +23,6 @@ static_assert(!std::is_base_of_v<Serialize::ISerializable, Object>);
 
 const ResourceRef sound = {QStringLiteral("sound"), Resource::AudioType};
 const auto blob = std::make_shared<const Types::Blob>();
-
-TEST(Waveform, IsOfNothingByDefault)
-{
-    const Object waveform;
-    EXPECT_EQ(waveform.resource, ResourceRef(QString(), Resource::NoType));
-    EXPECT_EQ(waveform.data, nullptr);
-}
-
-TEST(Waveform, SettersStoreAndReturnTheObject)
-{
-    Object waveform;
-    EXPECT_EQ(waveform.setResource(sound), &waveform);
-    EXPECT_EQ(waveform.setData(blob), &waveform);
-    EXPECT_EQ(waveform.resource, sound);
-    EXPECT_EQ(waveform.data, blob);
-    waveform.setData(nullptr);
-    EXPECT_EQ(waveform.data, nullptr);
-}
-
-TEST(Waveform, CopiesWholeAndSharesTheData)
-{
-    const auto expectWhole = [](const Object& waveform) {
-        EXPECT_EQ(waveform.resource, sound);
-        EXPECT_EQ(waveform.data, blob);
-    };
-    Object original;
-    original.setResource(sound)->setData(blob);
-    Object copy(original);
-    expectWhole(copy);
-    Object assigned;
-    EXPECT_EQ(&(assigned = original), &assigned);
-    const Object& itself = assigned;
-    assigned = itself;
-    expectWhole(assigned);
-    const Object moved(std::move(copy));
-    expectWhole(moved);
-    Object target;
-    EXPECT_EQ(&(target = std::move(assigned)), &target);
-    expectWhole(target);
-    expectWhole(original);
-}
 
 TEST(Waveform, ReachesItsObserversOnTheBus)
 {
