@@ -9,7 +9,6 @@
 #include <gmock/gmock.h>
 
 #include <type_traits>
-#include <utility>
 
 namespace {
 
@@ -43,20 +42,6 @@ Pack weatherPack()
     pack.appId = "weather";
     pack.downloadUrl = "http://a.test/weather.zip";
     return pack;
-}
-
-TEST(ImportObject, IsALocalFileOfUnknownPlaceByDefault)
-{
-    const Import::Object object;
-    EXPECT_EQ(object.tag, QString());
-    EXPECT_EQ(object.description, QString());
-    EXPECT_EQ(object.descriptionUrl, QString());
-    EXPECT_EQ(object.kind, 0);
-    EXPECT_EQ(object.category, QString());
-    EXPECT_EQ(object.pack, nullptr);
-    EXPECT_EQ(object.location(), QString());
-    EXPECT_EQ(object.remoteUrl(), QString());
-    EXPECT_EQ(object.remoteSize(), -1);
 }
 
 TEST(ImportObject, WithoutAPackItKnowsItsPlacesItself)
@@ -132,27 +117,6 @@ TEST(ImportObject, AsksAfreshWhereItsPackLies)
     module.directories.clear();
     EXPECT_EQ(object.location(), QString());
     EXPECT_EQ(module.senders.size(), 4u);
-}
-
-TEST(ImportObject, CopiesMovesAndAssignsEveryFieldItsPackIncluded)
-{
-    const Pack pack = weatherPack();
-    const Import::Object object = everyFieldSet(&pack);
-    Testing::expectWholeCopies(object);
-    Import::Object copy(object);
-    EXPECT_EQ(copy.pack, &pack);
-    Import::Object assigned;
-    assigned = object;
-    EXPECT_EQ(assigned.pack, &pack);
-    const Import::Object& itself = assigned;
-    assigned = itself;
-    EXPECT_EQ(assigned.pack, &pack);
-    Import::Object moved(std::move(copy));
-    EXPECT_EQ(moved.pack, &pack);
-    assigned = Import::Object();
-    EXPECT_EQ(assigned.pack, nullptr);
-    assigned = std::move(moved);
-    EXPECT_EQ(assigned.pack, &pack);
 }
 
 TEST(ImportObject, IsWrittenWithItsOwnPlacesAndWithoutItsPack)

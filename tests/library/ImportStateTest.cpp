@@ -6,7 +6,6 @@
 #include <gmock/gmock.h>
 
 #include <type_traits>
-#include <utility>
 
 namespace {
 
@@ -25,62 +24,6 @@ static_assert(std::is_base_of_v<Message::Types::Request<AcquireSubscription>, Re
 static_assert(std::is_base_of_v<PubSub::Subscriber<AcquireStateNotification>, Import::StateAcquier>);
 static_assert(std::is_same_v<std::underlying_type_t<State::Stage>, int>);
 static_assert(std::is_same_v<std::underlying_type_t<DeployResult>, int>);
-
-TEST(ImportState, IsAtItsInitialStageByDefault)
-{
-    const State state;
-    EXPECT_EQ(state.import, nullptr);
-    EXPECT_EQ(state.deployError, 0);
-    EXPECT_EQ(state.progress, 0.0);
-    EXPECT_EQ(state.stage, 2);
-}
-
-TEST(ImportState, ItsSettersStoreAndReturnTheState)
-{
-    const Import::Object object;
-    State state;
-    EXPECT_EQ(state.setImport(&object), &state);
-    EXPECT_EQ(state.import, &object);
-    EXPECT_EQ(state.setDeployError(DeployResult(4)), &state);
-    EXPECT_EQ(state.deployError, 4);
-    EXPECT_EQ(state.setProgress(-1.5), &state);
-    EXPECT_EQ(state.progress, -1.5);
-    EXPECT_EQ(state.setStage(State::Stage(9)), &state);
-    EXPECT_EQ(state.stage, 9);
-    state.setImport(nullptr)->setDeployError(DeployResult(0))->setProgress(1)->setStage(State::Stage(7));
-    EXPECT_EQ(state.import, nullptr);
-    EXPECT_EQ(state.deployError, 0);
-    EXPECT_EQ(state.progress, 1.0);
-    EXPECT_EQ(state.stage, 7);
-}
-
-TEST(ImportState, CopiesMovesAndAssignsEveryField)
-{
-    const Import::Object object;
-    const auto expectWhole = [&](const State& state) {
-        EXPECT_EQ(state.import, &object);
-        EXPECT_EQ(state.deployError, 4);
-        EXPECT_EQ(state.progress, 0.25);
-        EXPECT_EQ(state.stage, 5);
-    };
-    State state;
-    state.setImport(&object)->setDeployError(DeployResult(4))->setProgress(0.25)->setStage(State::Stage(5));
-    State copy(state);
-    expectWhole(copy);
-    State assigned;
-    EXPECT_EQ(&(assigned = state), &assigned);
-    expectWhole(assigned);
-    const State& itself = assigned;
-    assigned = itself;
-    expectWhole(assigned);
-    State moved(std::move(copy));
-    expectWhole(moved);
-    assigned = State();
-    EXPECT_EQ(assigned.import, nullptr);
-    EXPECT_EQ(assigned.stage, 2);
-    assigned = std::move(moved);
-    expectWhole(assigned);
-}
 
 TEST(ImportStateMessages, HoldWhatTheyWereMadeWith)
 {

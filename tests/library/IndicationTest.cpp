@@ -24,20 +24,6 @@ Object everyFieldSet()
     return marks;
 }
 
-TEST(Indication, IsEmptyByDefault)
-{
-    const Object marks;
-    EXPECT_EQ(marks.id, QString());
-    EXPECT_THAT(marks.favoriteItems, IsEmpty());
-    EXPECT_THAT(marks.newItems, IsEmpty());
-    EXPECT_THAT(marks.knownItems, IsEmpty());
-}
-
-TEST(Indication, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
-}
-
 TEST(Indication, IsMadeByItsName)
 {
     Testing::expectMadeByName<Object>("Indication::Object");

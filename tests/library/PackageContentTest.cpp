@@ -7,14 +7,12 @@
 #include <gmock/gmock.h>
 
 #include <type_traits>
-#include <utility>
 
 namespace {
 
 using Package::CollectionAddOn;
 using testing::ElementsAre;
 using Testing::FieldText;
-using testing::IsEmpty;
 
 static_assert(!Testing::isVirtualBase<Serialize::ISerializable, Package::Resource>);
 static_assert(!Testing::isVirtualBase<Serialize::ISerializable, CollectionAddOn>);
@@ -62,28 +60,6 @@ Package::Object fullPackage()
     return package;
 }
 
-TEST(PackageResource, IsEmptyByDefault)
-{
-    const Package::Resource resource;
-    EXPECT_EQ(resource.type, 0);
-    EXPECT_EQ(resource.id, QString());
-    EXPECT_EQ(resource.file, QString());
-    EXPECT_TRUE(resource.timing == Resource::Timing());
-}
-
-TEST(PackageResource, CopiesWhole)
-{
-    Testing::expectWholeCopies(fullResource());
-    Package::Resource copy(fullResource());
-    EXPECT_EQ(copy.timing.mode, Resource::Timing::Looped);
-    Package::Resource assigned;
-    assigned = copy;
-    EXPECT_EQ(assigned.timing.mode, Resource::Timing::Looped);
-    assigned = Package::Resource();
-    assigned = std::move(copy);
-    EXPECT_EQ(assigned.timing.mode, Resource::Timing::Looped);
-}
-
 TEST(PackageResource, IsWrittenWithTheTimesOfItsTimingAmongItsOwnFields)
 {
     EXPECT_THAT(Testing::fieldTexts(fullResource()),
@@ -115,20 +91,6 @@ TEST(PackageResource, IsMadeByName)
     Testing::expectMadeByName<Package::Resource>("Package::Resource");
 }
 
-TEST(CollectionAddOn, IsEmptyByDefault)
-{
-    const CollectionAddOn addOn;
-    EXPECT_EQ(addOn.contentPath, QString());
-    EXPECT_EQ(addOn.translationDir, QString());
-    EXPECT_THAT(addOn.category2collection, IsEmpty());
-    EXPECT_THAT(addOn.resources, IsEmpty());
-}
-
-TEST(CollectionAddOn, CopiesWhole)
-{
-    Testing::expectWholeCopies(fullAddOn());
-}
-
 TEST(CollectionAddOn, IsWrittenWithItsResourcesLast)
 {
     const std::string collections = "\n  2 items"
@@ -158,42 +120,6 @@ TEST(CollectionAddOn, IsWrittenWithItsResourcesLast)
 TEST(CollectionAddOn, IsMadeByName)
 {
     Testing::expectMadeByName<CollectionAddOn>("Package::CollectionAddOn");
-}
-
-TEST(Package, IsEmptyByDefault)
-{
-    const Package::Object package;
-    EXPECT_EQ(package.reservedFirst, QString());
-    EXPECT_EQ(package.reservedSecond, QString());
-    EXPECT_EQ(package.reservedThird, QString());
-    for (const auto* const addOns :
-         {&package.overlays, &package.transitions, &package.effects, &package.imports, &package.quizzes})
-        EXPECT_THAT(*addOns, IsEmpty());
-    EXPECT_EQ(package.fontsDir, QString());
-}
-
-TEST(Package, CopiesMovesAndAssignsAlsoWhatIsNotStored)
-{
-    const auto expectReserved = [](const Package::Object& package) {
-        EXPECT_EQ(package.reservedFirst, "one");
-        EXPECT_EQ(package.reservedSecond, "two");
-        EXPECT_EQ(package.reservedThird, "three");
-    };
-    const Package::Object package = fullPackage();
-    Testing::expectWholeCopies(package);
-    Package::Object copy(package);
-    expectReserved(copy);
-    Package::Object assigned;
-    assigned = copy;
-    expectReserved(assigned);
-    const Package::Object& itself = assigned;
-    assigned = itself;
-    expectReserved(assigned);
-    Package::Object moved(std::move(copy));
-    expectReserved(moved);
-    assigned = Package::Object();
-    assigned = std::move(moved);
-    expectReserved(assigned);
 }
 
 TEST(Package, IsWrittenWithItsFontsInFrontOfItsQuizzes)

@@ -11,7 +11,6 @@ using Package::Storage;
 using Package::StorageItem;
 using testing::ElementsAre;
 using Testing::FieldText;
-using testing::IsEmpty;
 
 static_assert(Testing::isVirtualBase<Serialize::ISerializable, StorageItem>);
 static_assert(Testing::isVirtualBase<PubSub::Object, StorageItem>);
@@ -47,18 +46,6 @@ const std::string categoriesText = "\n  1 items"
                                    "\n      item 1"
                                    "\n      item: Q\"Weather\"";
 
-TEST(PackageStorageItem, IsEmptyByDefault)
-{
-    const StorageItem item;
-    EXPECT_THAT(item.collection2tags, IsEmpty());
-    EXPECT_THAT(item.collection2categories, IsEmpty());
-}
-
-TEST(PackageStorageItem, CopiesWhole)
-{
-    Testing::expectWholeCopies(fullItem());
-}
-
 TEST(PackageStorageItem, IsWrittenWithItsTagsFirst)
 {
     EXPECT_THAT(Testing::fieldTexts(fullItem()),
@@ -69,18 +56,6 @@ TEST(PackageStorageItem, IsWrittenWithItsTagsFirst)
 TEST(PackageStorageItem, IsMadeByName)
 {
     Testing::expectMadeByName<StorageItem>("Package::StorageItem");
-}
-
-TEST(PackageStorage, IsEmptyByDefault)
-{
-    EXPECT_THAT(Storage().package2storage, IsEmpty());
-}
-
-TEST(PackageStorage, CopiesWhole)
-{
-    Storage storage;
-    storage.package2storage = {{"weather", fullItem()}, {"empty", StorageItem()}};
-    Testing::expectWholeCopies(storage);
 }
 
 TEST(PackageStorage, IsWrittenWithAnItemForEachPackage)

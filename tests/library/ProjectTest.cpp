@@ -9,7 +9,6 @@
 
 #include <gmock/gmock.h>
 
-#include <utility>
 #include <vector>
 
 namespace ProjectExtraInfo {
@@ -52,28 +51,11 @@ protected:
         content.portable = true;
     }
 
-    void expectWhole(const Content& other) const
-    {
-        EXPECT_EQ(other.timeline, &timeline);
-        EXPECT_EQ(other.userCollection, &collection);
-        EXPECT_EQ(other.resourceTable, &table);
-        EXPECT_TRUE(other.portable);
-    }
-
     Timeline::Object timeline;
     EditorCollection::UserObject collection;
     ResourceTable::Object table;
     Content content;
 };
-
-TEST_F(ProjectContent, IsEmptyByDefault)
-{
-    const Content empty;
-    EXPECT_EQ(empty.timeline, nullptr);
-    EXPECT_EQ(empty.userCollection, nullptr);
-    EXPECT_EQ(empty.resourceTable, nullptr);
-    EXPECT_FALSE(empty.portable);
-}
 
 TEST_F(ProjectContent, IsMadeByItsName)
 {
@@ -84,24 +66,6 @@ TEST_F(ProjectContent, WritesItsFieldsInOrder)
 {
     EXPECT_THAT(Testing::fieldKeys(content),
                 ElementsAre("timeline", "userCollection", "resourceTable", "portable"));
-}
-
-TEST_F(ProjectContent, CopiesNameTheSameObjects)
-{
-    Content copy(content);
-    expectWhole(copy);
-    Content assigned;
-    EXPECT_EQ(&(assigned = copy), &assigned);
-    expectWhole(assigned);
-    const Content& itself = assigned;
-    assigned = itself;
-    expectWhole(assigned);
-    const Content moved(std::move(copy));
-    expectWhole(moved);
-    Content target;
-    target = std::move(assigned);
-    expectWhole(target);
-    expectWhole(content);
 }
 
 TEST_F(ProjectContent, LetsItsObjectsLive)

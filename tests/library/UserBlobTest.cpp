@@ -85,28 +85,6 @@ private:
     }
 };
 
-TEST(UserBlobResult, IsThatOfNoAnswerByDefault)
-{
-    expectResult(Result(), 0, "", 2, "");
-}
-
-TEST(UserBlobResult, CopiesMovesAndAssignsEveryMember)
-{
-    const Result result = {1, "a", 3, "b"};
-    Result copy(result);
-    expectResult(copy, 1, "a", 3, "b");
-    Result assigned;
-    assigned = result;
-    const Result& itself = assigned;
-    assigned = itself;
-    expectResult(assigned, 1, "a", 3, "b");
-    Result moved(std::move(copy));
-    expectResult(moved, 1, "a", 3, "b");
-    Result target;
-    target = std::move(moved);
-    expectResult(target, 1, "a", 3, "b");
-}
-
 TEST(UserBlobHelper, HasTheDefaultResultIfNobodyAnswers)
 {
     Helper helper;

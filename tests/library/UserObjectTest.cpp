@@ -30,11 +30,6 @@ protected:
     UserObject collection;
 };
 
-TEST_F(UserCollection, IsEmptyByDefault)
-{
-    EXPECT_THAT(collection.items, IsEmpty());
-}
-
 TEST_F(UserCollection, IsMadeByItsName)
 {
     Testing::expectMadeByName<UserObject>("EditorCollection::UserObject");
@@ -43,26 +38,6 @@ TEST_F(UserCollection, IsMadeByItsName)
 TEST_F(UserCollection, WritesItsItemsAlone)
 {
     EXPECT_THAT(Testing::fieldKeys(collection), ElementsAre("items"));
-}
-
-TEST_F(UserCollection, CopiesNameTheSameItems)
-{
-    collection.items = {&a, &b};
-    UserObject copy(collection);
-    EXPECT_TRUE(copy == collection);
-    UserObject assigned;
-    EXPECT_EQ(&(assigned = copy), &assigned);
-    EXPECT_THAT(assigned.items, ElementsAre(&a, &b));
-    const UserObject& itself = assigned;
-    assigned = itself;
-    EXPECT_THAT(assigned.items, ElementsAre(&a, &b));
-    UserObject moved(std::move(copy));
-    EXPECT_THAT(moved.items, ElementsAre(&a, &b));
-    UserObject target;
-    target.items = {&c};
-    EXPECT_EQ(&(target = std::move(moved)), &target);
-    EXPECT_THAT(target.items, ElementsAre(&a, &b));
-    EXPECT_THAT(collection.items, ElementsAre(&a, &b));
 }
 
 TEST_F(UserCollection, OperationsReturnTheCollectionAsAnObjectOfTheBus)
