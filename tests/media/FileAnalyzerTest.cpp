@@ -73,35 +73,13 @@ private:
     Lines m_lines;
 };
 
-TEST(FileAnalyzer, IsQueuedAndEmptyByDefault)
+TEST(FileAnalyzer, IsQueuedAtFirst)
 {
     const Object object;
-    EXPECT_THAT(object.files, IsEmpty());
-    EXPECT_EQ(object.status, Queued);
-    EXPECT_THAT(object.opened, IsEmpty());
-    EXPECT_THAT(object.failed, IsEmpty());
     EXPECT_TRUE(object.queued());
     EXPECT_FALSE(object.processing());
     EXPECT_FALSE(object.processed());
     EXPECT_FALSE(object.canceled());
-}
-
-TEST(FileAnalyzer, ItsSettersStoreAndReturnTheObject)
-{
-    const Media::File files[3];
-    Object object;
-    EXPECT_EQ(object.setFiles({"/b.mp4", "/a.mp4", "/b.mp4"}), &object);
-    EXPECT_THAT(object.files, ElementsAre("/b.mp4", "/a.mp4", "/b.mp4"));
-    EXPECT_EQ(object.setStatus(Processing), &object);
-    EXPECT_EQ(object.status, Processing);
-    EXPECT_EQ(object.setOpened({&files[2], &files[0]}), &object);
-    EXPECT_THAT(object.opened, ElementsAre(&files[2], &files[0]));
-    EXPECT_EQ(object.setFailed({&files[1]}), &object);
-    EXPECT_THAT(object.failed, ElementsAre(&files[1]));
-    object.setOpened({})->setFailed({})->setFiles({});
-    EXPECT_THAT(object.files, IsEmpty());
-    EXPECT_THAT(object.opened, IsEmpty());
-    EXPECT_THAT(object.failed, IsEmpty());
 }
 
 TEST(FileAnalyzer, AnswersForEachStatus)
@@ -129,36 +107,6 @@ TEST(FileAnalyzer, CancelsFromAnyStatusAndTouchesNothingElse)
         EXPECT_THAT(object.opened, ElementsAre(&file));
         EXPECT_THAT(object.failed, ElementsAre(&file));
     }
-}
-
-TEST(FileAnalyzer, CopiesMovesAndAssignsEveryField)
-{
-    const Media::File files[2];
-    const auto expectWhole = [&](const Object& object) {
-        EXPECT_THAT(object.files, ElementsAre("/a.mp4", "/b.mp4"));
-        EXPECT_EQ(object.status, Processed);
-        EXPECT_THAT(object.opened, ElementsAre(&files[0]));
-        EXPECT_THAT(object.failed, ElementsAre(&files[1]));
-    };
-    Object object;
-    object.setFiles({"/a.mp4", "/b.mp4"})
-        ->setStatus(Processed)
-        ->setOpened({&files[0]})
-        ->setFailed({&files[1]});
-
-    const Object copy(object);
-    expectWhole(copy);
-    Object moved(std::move(object));
-    expectWhole(moved);
-    Object assigned;
-    assigned = copy;
-    expectWhole(assigned);
-    Object& same = assigned;
-    assigned = same;
-    expectWhole(assigned);
-    assigned = Object();
-    assigned = std::move(moved);
-    expectWhole(assigned);
 }
 
 /// What a change of status calls, between the three-pointer callback and the others.

@@ -8,7 +8,6 @@
 #include <gmock/gmock.h>
 
 #include <type_traits>
-#include <utility>
 
 namespace Media {
 class Metadata
@@ -98,55 +97,14 @@ struct CountedTrack : Track::Video
     int& count;
 };
 
-TEST(MediaFile, IsClosedAndEmptyByDefault)
+TEST(MediaFile, GivesItselfBackForEveryChangeOfItsTracks)
 {
-    expectDefaults(Media::File());
-}
-
-TEST(MediaFile, SettersStoreAndReturnTheObject)
-{
-    Fixture fixture;
-    Media::File& file = fixture.file;
-    fixture.expectEveryFieldSet(file);
-    EXPECT_EQ(file.setPath("x"), &file);
-    EXPECT_EQ(file.setSize(-1), &file);
-    EXPECT_EQ(file.setLastModified(-2), &file);
-    EXPECT_EQ(file.setFormat(""), &file);
-    EXPECT_EQ(file.setLength(MTime(-3)), &file);
-    EXPECT_EQ(file.setMetadata(nullptr), &file);
-    EXPECT_EQ(file.setOpening(false), &file);
-    EXPECT_EQ(file.setOpened(false), &file);
-    EXPECT_EQ(file.setFailed(false), &file);
-    EXPECT_EQ(file.setUnsupportedCodecs({}), &file);
-    EXPECT_EQ(file.setComposition(nullptr), &file);
-    EXPECT_EQ(file.addTrack(&fixture.picture), &file);
-    EXPECT_EQ(file.addTrack(&fixture.sound), &file);
+    const Track::Video picture;
+    const Track::Audio sound;
+    Media::File file;
+    EXPECT_EQ(file.addTrack(&picture), &file);
+    EXPECT_EQ(file.addTrack(&sound), &file);
     EXPECT_EQ(file.clearTracks(), &file);
-    EXPECT_EQ(file.size, -1);
-    EXPECT_EQ(file.lastModified, -2);
-    EXPECT_EQ(file.length, MTime(-3));
-    EXPECT_EQ(file.metadata, nullptr);
-    EXPECT_EQ(file.composition, nullptr);
-}
-
-TEST(MediaFile, CopiesWhole)
-{
-    const Fixture fixture;
-    const Media::File copy(fixture.file);
-    fixture.expectEveryFieldSet(copy);
-
-    Media::File assigned;
-    EXPECT_EQ(&(assigned = fixture.file), &assigned);
-    fixture.expectEveryFieldSet(assigned);
-    const Media::File& itself = assigned;
-    assigned = itself;
-    fixture.expectEveryFieldSet(assigned);
-
-    Media::File moved(std::move(assigned));
-    fixture.expectEveryFieldSet(moved);
-    Media::File target;
-    target = std::move(moved);
-    fixture.expectEveryFieldSet(target);
 }
 
 TEST(MediaFile, ForgetsEverythingWithoutDestroyingItsTracks)
@@ -185,101 +143,6 @@ TEST(MediaFile, LetsGoOfItsTracksAndNothingElse)
     EXPECT_THAT(file.audioTracks, IsEmpty());
     file.addTrack(&fixture.picture)->addTrack(&fixture.sound);
     fixture.expectEveryFieldSet(file);
-}
-
-TEST(MediaFileTrack, BelongsToNoFileByDefault)
-{
-    const Track track;
-    EXPECT_EQ(track.file, nullptr);
-    EXPECT_EQ(track.index, 0);
-    EXPECT_EQ(track.codecId, "");
-    EXPECT_EQ(track.bitrate, 0);
-    EXPECT_FALSE(Track::Video().isImage);
-    EXPECT_EQ(Track::Video().width, 1920);
-    EXPECT_EQ(Track::Audio().sampleRate, 44100);
-}
-
-template <class T>
-T trackWithEveryFieldSet(const Media::File& file)
-{
-    T track;
-    track.file = &file;
-    track.index = 3;
-    track.codecId = "codec";
-    track.bitrate = 128000;
-    return track;
-}
-
-void expectEveryFieldSet(const Track& track, const Media::File& file)
-{
-    EXPECT_EQ(track.file, &file);
-    EXPECT_EQ(track.index, 3);
-    EXPECT_EQ(track.codecId, "codec");
-    EXPECT_EQ(track.bitrate, 128000);
-}
-
-TEST(MediaFileTrack, CopiesWhole)
-{
-    const Media::File file;
-    const Track track = trackWithEveryFieldSet<Track>(file);
-    Track assigned;
-    assigned = track;
-    const Track& itself = assigned;
-    assigned = itself;
-    expectEveryFieldSet(assigned, file);
-    expectEveryFieldSet(Track(std::move(assigned)), file);
-}
-
-TEST(MediaFileTrack, CopiesWholeWithItsSound)
-{
-    const Media::File file;
-    auto track = trackWithEveryFieldSet<Track::Audio>(file);
-    track.label = "commentary";
-    track.setChannelLayout(Norvel::Conf::ChannelLayout(1))->setSampleRate(8000);
-    track.setSampleFormat(Norvel::Conf::SampleFormats(3));
-    const auto expectWhole = [&file](const Track::Audio& other) {
-        expectEveryFieldSet(other, file);
-        EXPECT_EQ(other.label, "commentary");
-        EXPECT_EQ(other.channelLayout, 1);
-        EXPECT_EQ(other.sampleRate, 8000);
-        EXPECT_EQ(other.sampleFormat, 3);
-    };
-    Track::Audio assigned;
-    assigned = track;
-    expectWhole(assigned);
-    const Track::Audio& itself = assigned;
-    assigned = itself;
-    expectWhole(assigned);
-    expectWhole(Track::Audio(std::move(assigned)));
-}
-
-TEST(MediaFileTrack, CopiesWholeWithItsPicture)
-{
-    const Media::File file;
-    auto track = trackWithEveryFieldSet<Track::Video>(file);
-    track.isImage = true;
-    track.label = "cover";
-    track.setGeometry(300, 200)->setFrameRate(1, 2)->setAspect(3, 4)->setExportMode(true)->setOpaque(false);
-    const auto expectWhole = [&file](const Track::Video& other) {
-        expectEveryFieldSet(other, file);
-        EXPECT_TRUE(other.isImage);
-        EXPECT_EQ(other.label, "cover");
-        EXPECT_EQ(other.width, 300);
-        EXPECT_EQ(other.height, 200);
-        EXPECT_EQ(other.frameRateN, 1);
-        EXPECT_EQ(other.frameRateD, 2);
-        EXPECT_EQ(other.aspectX, 3);
-        EXPECT_EQ(other.aspectY, 4);
-        EXPECT_TRUE(other.exportMode);
-        EXPECT_FALSE(other.opaque);
-    };
-    Track::Video assigned;
-    assigned = track;
-    expectWhole(assigned);
-    const Track::Video& itself = assigned;
-    assigned = itself;
-    expectWhole(assigned);
-    expectWhole(Track::Video(std::move(assigned)));
 }
 
 /// In the form that is given, with the text of its file replaced.

@@ -23,14 +23,6 @@ static_assert(!std::is_base_of_v<PubSub::Object, FileInfo>);
 static_assert(!std::is_base_of_v<PubSub::Object, Timing>);
 static_assert(!std::is_polymorphic_v<ResourceTiming>);
 
-TEST(FileInfo, IsEmptyByDefault)
-{
-    const FileInfo info;
-    EXPECT_EQ(info.path, "");
-    EXPECT_EQ(info.track, 0);
-    EXPECT_EQ(info.duration, MTime());
-}
-
 FileInfo fullInfo()
 {
     FileInfo info;
@@ -54,30 +46,6 @@ TEST(FileInfo, IsEqualWhereEveryFieldIs)
     other = fullInfo();
     other.duration = 61001;
     EXPECT_FALSE(info == other);
-}
-
-TEST(FileInfo, CopiesMovesAndAssignsEveryField)
-{
-    FileInfo info = fullInfo();
-    const FileInfo copy(info);
-    EXPECT_TRUE(copy == fullInfo());
-    const FileInfo moved(std::move(info));
-    EXPECT_TRUE(moved == fullInfo());
-    FileInfo assigned;
-    assigned = copy;
-    EXPECT_TRUE(assigned == fullInfo());
-    FileInfo& same = assigned;
-    assigned = same;
-    EXPECT_TRUE(assigned == fullInfo());
-}
-
-TEST(Timing, IsDescribedAndZeroByDefault)
-{
-    const Timing timing;
-    EXPECT_EQ(timing.mode, 0);
-    EXPECT_EQ(timing.intro, MTime());
-    EXPECT_EQ(timing.outro, MTime());
-    EXPECT_EQ(timing.loopMinCount, 0);
 }
 
 Timing fullTiming()
@@ -107,21 +75,6 @@ TEST(Timing, IsEqualWhereEveryFieldIs)
     other = fullTiming();
     other.loopMinCount = 5;
     EXPECT_FALSE(timing == other);
-}
-
-TEST(Timing, CopiesMovesAndAssignsEveryField)
-{
-    Timing timing = fullTiming();
-    const Timing copy(timing);
-    EXPECT_TRUE(copy == fullTiming());
-    const Timing moved(std::move(timing));
-    EXPECT_TRUE(moved == fullTiming());
-    Timing assigned;
-    assigned = copy;
-    EXPECT_TRUE(assigned == fullTiming());
-    Timing& same = assigned;
-    assigned = same;
-    EXPECT_TRUE(assigned == fullTiming());
 }
 
 TEST(ResourceInfo, HasItsArchiveNames)

@@ -18,7 +18,6 @@ namespace {
 using Media::OverlaySource;
 using Media::Source;
 using testing::ElementsAre;
-using testing::IsEmpty;
 
 static_assert(Testing::isVirtualBase<PubSub::Object, Source>);
 static_assert(Testing::isVirtualBase<PubSub::Object, OverlaySource>);
@@ -44,27 +43,6 @@ Source sourceWithEveryFieldSet()
     source.setDefaultImpl("a name that is longer than what a string holds in place");
     source.setResizeMode(Media::ResizeMode(3));
     return source;
-}
-
-void expectEveryFieldSet(const Source& source)
-{
-    EXPECT_EQ(source.resource, film);
-    EXPECT_EQ(source.from, MTime(100));
-    EXPECT_EQ(source.to, MTime(900));
-    EXPECT_EQ(source.timingMode, 1);
-    EXPECT_EQ(source.repeatMode, 2);
-    EXPECT_EQ(source.sourceDuration, MTime(5000));
-    EXPECT_TRUE(source.speedCompensated);
-    EXPECT_EQ(source.volume, 80);
-    EXPECT_EQ(source.volumeEnvelope, &volume);
-    EXPECT_EQ(source.cropEnvelope, &crop);
-    EXPECT_EQ(source.moveEnvelope, &move);
-    EXPECT_EQ(source.fadeIn, MTime(30));
-    EXPECT_EQ(source.fadeOut, MTime(40));
-    EXPECT_TRUE(source.reversed);
-    EXPECT_THAT(source.effects, ElementsAre(&echo, &blur));
-    EXPECT_EQ(source.defaultImpl, "a name that is longer than what a string holds in place");
-    EXPECT_EQ(source.resizeMode, 3);
 }
 
 /// The callback counts its calls in `calls`.
@@ -113,55 +91,9 @@ void expectCopiesAreWhole(const T& original, const Expectation& expectWhole)
     expectWhole(original);
 }
 
-TEST(MediaSource, PlaysNothingByDefault)
+TEST(MediaSource, HasNoDurationAtFirst)
 {
-    const Source source;
-    EXPECT_EQ(source.resource, ResourceRef(QString(), Resource::NoType));
-    EXPECT_EQ(source.from, MTime());
-    EXPECT_EQ(source.to, MTime());
-    EXPECT_EQ(source.timingMode, 0);
-    EXPECT_EQ(source.repeatMode, 0);
-    EXPECT_EQ(source.sourceDuration, MTime());
-    EXPECT_FALSE(source.speedCompensated);
-    EXPECT_EQ(source.volume, 100);
-    EXPECT_EQ(source.volumeEnvelope, nullptr);
-    EXPECT_EQ(source.cropEnvelope, nullptr);
-    EXPECT_EQ(source.moveEnvelope, nullptr);
-    EXPECT_EQ(source.fadeIn, MTime());
-    EXPECT_EQ(source.fadeOut, MTime());
-    EXPECT_FALSE(source.reversed);
-    EXPECT_THAT(source.effects, IsEmpty());
-    EXPECT_EQ(source.defaultImpl, "");
-    EXPECT_EQ(source.resizeMode, 0);
-    EXPECT_EQ(source.duration(), MTime(0));
-}
-
-TEST(MediaSource, SettersStoreAndReturnTheSourcesAddress)
-{
-    Source source;
-    EXPECT_EQ(source.setResource(film), &source);
-    EXPECT_EQ(source.setRange(1, 2), &source);
-    EXPECT_EQ(source.setTimingMode(Media::TimingMode(-1)), &source);
-    EXPECT_EQ(source.setRepeatMode(Source::RepeatMode(-2)), &source);
-    EXPECT_EQ(source.setSourceDuration(-3), &source);
-    EXPECT_EQ(source.setSpeedCompensated(true), &source);
-    EXPECT_EQ(source.setVolume(-4), &source);
-    EXPECT_EQ(source.setVolumeEnvelope(nullptr), &source);
-    EXPECT_EQ(source.setCropEnvelope(nullptr), &source);
-    EXPECT_EQ(source.setMoveEnvelope(nullptr), &source);
-    EXPECT_EQ(source.setFades(-5, -6), &source);
-    EXPECT_EQ(source.setReversed(true), &source);
-    EXPECT_EQ(source.setEffects({}), &source);
-    EXPECT_EQ(source.setDefaultImpl(""), &source);
-    EXPECT_EQ(source.setResizeMode(Media::ResizeMode(-7)), &source);
-
-    EXPECT_EQ(source.timingMode, -1);
-    EXPECT_EQ(source.repeatMode, -2);
-    EXPECT_EQ(source.sourceDuration, MTime(-3));
-    EXPECT_EQ(source.volume, -4);
-    EXPECT_EQ(source.fadeIn, MTime(-5));
-    EXPECT_EQ(source.resizeMode, -7);
-    expectEveryFieldSet(sourceWithEveryFieldSet());
+    EXPECT_EQ(Source().duration(), MTime(0));
 }
 
 TEST(MediaSource, LastsFromTheBeginningOfItsRangeToTheEnd)
@@ -199,20 +131,6 @@ TEST(MediaSource, EffectsAreReplacedByACopyOfTheListAndShared)
     EXPECT_THAT(source.effects, ElementsAre(&echo, nullptr, &echo));
 }
 
-TEST(MediaSource, CopiesWhole)
-{
-    expectCopiesAreWhole(sourceWithEveryFieldSet(), [](const Source& copy) { expectEveryFieldSet(copy); });
-}
-
-TEST(MediaSource, AssigningItToItselfLeavesTheNameOfTheImplementation)
-{
-    Source source;
-    source.setDefaultImpl("player");
-    const Source& itself = source;
-    source = itself;
-    EXPECT_EQ(source.defaultImpl, "player");
-}
-
 TEST(MediaSource, ChangesInPlaceOnTheBus)
 {
     Source source;
@@ -223,32 +141,6 @@ TEST(MediaSource, ChangesInPlaceOnTheBus)
     EXPECT_EQ(source.volume, 50);
     EXPECT_EQ(source.duration(), MTime(10));
     EXPECT_TRUE(observer.isObserved(&source));
-}
-
-TEST(OverlaySource, PlaysNothingByDefault)
-{
-    const OverlaySource source;
-    EXPECT_EQ(source.overlay, nullptr);
-    EXPECT_EQ(source.moveEnvelope, nullptr);
-    EXPECT_EQ(source.trackingLinkInfo.trackingId, QString());
-    EXPECT_EQ(source.trackingLinkInfo.offset, QPointF(0, 0));
-    EXPECT_FALSE(source.trackingLinkInfo.callback);
-    EXPECT_EQ(source.sourcePosition, MTime());
-    EXPECT_EQ(source.sourceDuration, MTime());
-}
-
-TEST(OverlaySource, SettersStoreAndReturnTheSourceItself)
-{
-    OverlaySource source;
-    EXPECT_EQ(&source.setOverlay(&title), &source);
-    EXPECT_EQ(&source.setMoveEnvelope(&move), &source);
-    EXPECT_EQ(&source.setTrackingLinkInfo({}), &source);
-    EXPECT_EQ(&source.setSourcePosition(-1), &source);
-    EXPECT_EQ(&source.setSourceDuration(-2), &source);
-    EXPECT_EQ(source.sourcePosition, MTime(-1));
-    EXPECT_EQ(source.sourceDuration, MTime(-2));
-    int calls = 0;
-    expectEveryFieldSet(overlaySourceWithEveryFieldSet(calls), calls);
 }
 
 TEST(OverlaySource, CopiesWholeWithItsCallback)
