@@ -90,66 +90,6 @@ TEST(ValueTypeTrait, IsThereBeforeTheConstantsOfOthers)
     EXPECT_EQ(earlyDefault.matrix.m11, 1.0);
 }
 
-TEST(KeyValue, StandsAtZeroWithADefaultValue)
-{
-    const KeyValue<double> volume;
-    EXPECT_EQ(volume.step, 0.0);
-    EXPECT_EQ(volume.value, 0.0);
-    const KeyValue<Transformation::Object> transformation;
-    EXPECT_EQ(transformation.step, 0.0);
-    EXPECT_EQ(transformation.value, Transformation::Object());
-}
-
-TEST(KeyValue, CopiesWhole)
-{
-    const KeyValue<double> original(0.25, 3.0);
-    const KeyValue<double> copy(original);
-    EXPECT_EQ(copy.step, 0.25);
-    EXPECT_EQ(copy.value, 3.0);
-    KeyValue<double> assigned;
-    EXPECT_EQ(&(assigned = original), &assigned);
-    const auto& itself = assigned;
-    assigned = itself;
-    EXPECT_EQ(assigned.step, 0.25);
-    EXPECT_EQ(assigned.value, 3.0);
-
-    Transformation::Object half;
-    half.setOpacity(50);
-    const KeyValue<Transformation::Object> key(0.5, half);
-    const KeyValue<Transformation::Object> keyCopy(key);
-    EXPECT_EQ(keyCopy.step, 0.5);
-    EXPECT_EQ(keyCopy.value, half);
-}
-
-TEST(AnimationItem, HasNoKeysAndTheDefaultOfItsTrait)
-{
-    const VolumeEnvelope volume;
-    EXPECT_THAT(volume.keyValues, IsEmpty());
-    EXPECT_EQ(volume.defaultValue, 1.0);
-    const TransformationEnvelope transformation;
-    EXPECT_THAT(transformation.keyValues, IsEmpty());
-    EXPECT_EQ(transformation.defaultValue, Transformation::Object());
-}
-
-TEST(AnimationItem, CopiesTheListAndTheDefault)
-{
-    VolumeEnvelope original = envelopeOf({{0, 1}, {1, 2}});
-    original.defaultValue = 7;
-    const VolumeEnvelope copy(original);
-    EXPECT_THAT(keysOf(copy), ElementsAre(Pair(0, 1), Pair(1, 2)));
-    EXPECT_EQ(copy.defaultValue, 7);
-
-    VolumeEnvelope assigned = envelopeOf({{5, 5}});
-    EXPECT_EQ(&(assigned = original), &assigned);
-    EXPECT_THAT(keysOf(assigned), ElementsAre(Pair(0, 1), Pair(1, 2)));
-    EXPECT_EQ(assigned.defaultValue, 7);
-    const VolumeEnvelope& itself = assigned;
-    assigned = itself;
-    EXPECT_THAT(keysOf(assigned), ElementsAre(Pair(0, 1), Pair(1, 2)));
-    EXPECT_EQ(assigned.defaultValue, 7);
-    EXPECT_THAT(keysOf(original), ElementsAre(Pair(0, 1), Pair(1, 2)));
-}
-
 TEST(AnimationItem, MovesTheListAndCopiesTheDefault)
 {
     VolumeEnvelope original = envelopeOf({{0, 1}, {1, 2}});

@@ -44,17 +44,6 @@ Effect::Object everyFieldSet()
     return effect;
 }
 
-TEST(Effect, IsAtFullIntensityAndNotBypassedByDefault)
-{
-    const Effect::Object effect;
-    EXPECT_EQ(effect.id, QString());
-    EXPECT_EQ(effect.uniqueId, QString());
-    EXPECT_EQ(effect.tag, QString());
-    EXPECT_EQ(effect.description, QString());
-    EXPECT_EQ(effect.intensity, 1.0);
-    EXPECT_FALSE(effect.bypass);
-}
-
 TEST(Effect, IsMadeWithItsIdentifiers)
 {
     EXPECT_EQ(Effect::Object("Blur").id, "Blur");
@@ -100,23 +89,6 @@ TEST(Effect, ItsVirtualFunctionsKeepTheirPlaces)
 }
 
 #endif
-
-TEST(Effect, SettersStoreAndReturnTheEffect)
-{
-    Effect::Object effect;
-    EXPECT_EQ(effect.setTag("Soft"), &effect);
-    EXPECT_EQ(effect.setDescription("Makes it soft"), &effect);
-    EXPECT_EQ(effect.setBypass(true), &effect);
-    EXPECT_EQ(effect.tag, "Soft");
-    EXPECT_EQ(effect.description, "Makes it soft");
-    EXPECT_TRUE(effect.bypass);
-    EXPECT_THAT(Testing::defaultFields(effect), ElementsAre("id", "uniqueId", "intensity"));
-}
-
-TEST(Effect, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
-}
 
 TEST(Effect, HasAMimeTypeForPicturesAndOneForSound)
 {

@@ -10,7 +10,6 @@ namespace {
 
 using testing::ElementsAre;
 using Testing::FieldText;
-using testing::IsEmpty;
 
 static_assert(!Testing::isVirtualBase<Serialize::ISerializable, Quiz::Question>);
 static_assert(!Testing::isVirtualBase<Serialize::ISerializable, Quiz::Preset>);
@@ -54,20 +53,6 @@ Quiz::Preset changedPreset(Change change)
     Quiz::Preset preset = everyFieldSet();
     change(preset);
     return preset;
-}
-
-TEST(QuizQuestion, IsEmptyByDefault)
-{
-    const Quiz::Question question;
-    EXPECT_EQ(question.type, 0);
-    EXPECT_EQ(question.text, QString());
-    EXPECT_THAT(question.answers, IsEmpty());
-    EXPECT_THAT(question.correctAnswers, IsEmpty());
-}
-
-TEST(QuizQuestion, CopiesWhole)
-{
-    Testing::expectWholeCopies(capital);
 }
 
 TEST(QuizQuestion, EqualsWhatHasTheSameFields)
@@ -126,19 +111,6 @@ TEST(QuizQuestion, IsWrittenInTheOrderOfItsFields)
 TEST(QuizQuestion, IsMadeByName)
 {
     Testing::expectMadeByName<Quiz::Question>("Quiz::Question");
-}
-
-TEST(QuizPreset, IsEmptyByDefault)
-{
-    const Quiz::Preset preset;
-    EXPECT_THAT(preset.questions, IsEmpty());
-    EXPECT_EQ(preset.tag, QString());
-    EXPECT_EQ(preset.description, QString());
-}
-
-TEST(QuizPreset, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
 }
 
 TEST(QuizPreset, EqualsWhatHasTheSameFields)

@@ -9,7 +9,6 @@ namespace {
 
 using testing::ElementsAre;
 using Testing::FieldText;
-using testing::IsEmpty;
 
 static_assert(Testing::isVirtualBase<Serialize::ISerializable, Theme::Object>);
 static_assert(Testing::isVirtualBase<PubSub::Object, Theme::Object>);
@@ -26,24 +25,6 @@ Theme::Object everyFieldSet()
     theme.minSceneDuration = 1000;
     theme.maxSceneDuration = 9000;
     return theme;
-}
-
-TEST(Theme, HasScenesOfFourToFiveSecondsAndNoTransitionsByDefault)
-{
-    const Theme::Object theme;
-    EXPECT_EQ(theme.tag, QString());
-    EXPECT_THAT(theme.transitionsList, IsEmpty());
-    EXPECT_EQ(theme.previewVideo, QString());
-    EXPECT_EQ(theme.music, QString());
-    EXPECT_EQ(theme.startTitle, QString());
-    EXPECT_EQ(theme.finalTitle, QString());
-    EXPECT_EQ(theme.minSceneDuration, MTime(4000));
-    EXPECT_EQ(theme.maxSceneDuration, MTime(5000));
-}
-
-TEST(Theme, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
 }
 
 TEST(Theme, IsWrittenInTheOrderOfItsFields)

@@ -29,50 +29,6 @@ TransformationPreset presetWithEveryFieldSet()
     return preset;
 }
 
-void expectEveryFieldSet(const TransformationPreset& preset)
-{
-    EXPECT_EQ(preset.type, 3);
-    EXPECT_EQ(preset.tag, "slow");
-    EXPECT_EQ(preset.description, "From left to right");
-    EXPECT_EQ(preset.sourceDuration, MTime(2500));
-    ASSERT_EQ(preset.transformation.keyValues.size(), 1u);
-    EXPECT_EQ(preset.transformation.keyValues.front().step, 0.5);
-    EXPECT_EQ(preset.transformation.keyValues.front().value.opacity, 70);
-    EXPECT_EQ(preset.transformation.defaultValue.opacity, 20);
-}
-
-TEST(TransformationPreset, IsEmptyByDefault)
-{
-    const TransformationPreset preset;
-    EXPECT_EQ(preset.type, 0);
-    EXPECT_TRUE(preset.tag.isEmpty());
-    EXPECT_TRUE(preset.description.isEmpty());
-    EXPECT_EQ(preset.sourceDuration, MTime());
-    EXPECT_TRUE(preset.transformation.keyValues.empty());
-    EXPECT_EQ(preset.transformation.defaultValue, Transformation::Object());
-}
-
-TEST(TransformationPreset, CopiesWhole)
-{
-    const TransformationPreset original = presetWithEveryFieldSet();
-    TransformationPreset copy(original);
-    expectEveryFieldSet(copy);
-
-    TransformationPreset assigned;
-    EXPECT_EQ(&(assigned = original), &assigned);
-    expectEveryFieldSet(assigned);
-    const TransformationPreset& itself = assigned;
-    assigned = itself;
-    expectEveryFieldSet(assigned);
-
-    TransformationPreset moved(std::move(copy));
-    expectEveryFieldSet(moved);
-    TransformationPreset target;
-    EXPECT_EQ(&(target = std::move(moved)), &target);
-    expectEveryFieldSet(target);
-    expectEveryFieldSet(original);
-}
-
 TEST(TransformationPreset, LeavesNoKeysBehindWhenItIsMoved)
 {
     TransformationPreset original = presetWithEveryFieldSet();

@@ -8,7 +8,6 @@
 
 #include <memory>
 #include <type_traits>
-#include <utility>
 
 namespace {
 
@@ -20,66 +19,6 @@ static_assert(!Testing::isVirtualBase<Serialize::ISerializable, Object>);
 static_assert(!std::is_base_of_v<PubSub::Object, Object>);
 
 const Transform oneToNine(1, 2, 3, 4, 5, 6, 7, 8, 9);
-
-void expectOneToNine(const Object& object)
-{
-    EXPECT_EQ(object.matrix.m11, 1);
-    EXPECT_EQ(object.matrix.m12, 2);
-    EXPECT_EQ(object.matrix.m13, 3);
-    EXPECT_EQ(object.matrix.m21, 4);
-    EXPECT_EQ(object.matrix.m22, 5);
-    EXPECT_EQ(object.matrix.m23, 6);
-    EXPECT_EQ(object.matrix.m31, 7);
-    EXPECT_EQ(object.matrix.m32, 8);
-    EXPECT_EQ(object.matrix.m33, 9);
-    EXPECT_EQ(object.opacity, 60);
-}
-
-TEST(Transformation, IsAnOpaqueIdentityByDefault)
-{
-    const Object object;
-    EXPECT_EQ(object.matrix.m11, 1.0);
-    EXPECT_EQ(object.matrix.m12, 0.0);
-    EXPECT_EQ(object.matrix.m13, 0.0);
-    EXPECT_EQ(object.matrix.m21, 0.0);
-    EXPECT_EQ(object.matrix.m22, 1.0);
-    EXPECT_EQ(object.matrix.m23, 0.0);
-    EXPECT_EQ(object.matrix.m31, 0.0);
-    EXPECT_EQ(object.matrix.m32, 0.0);
-    EXPECT_EQ(object.matrix.m33, 1.0);
-    EXPECT_EQ(object.opacity, 100);
-}
-
-TEST(Transformation, SettersStoreWhatTheyAreGivenAndReturnTheObject)
-{
-    Object object;
-    EXPECT_EQ(object.setMatrix(oneToNine), &object);
-    EXPECT_EQ(object.setOpacity(-7), &object);
-    EXPECT_EQ(object.opacity, -7);
-    object.setMatrix(oneToNine)->setOpacity(60);
-    expectOneToNine(object);
-}
-
-TEST(Transformation, CopiesWhole)
-{
-    const Object original(oneToNine, 60);
-    expectOneToNine(original);
-    Object copy(original);
-    expectOneToNine(copy);
-
-    Object assigned;
-    EXPECT_EQ(&(assigned = original), &assigned);
-    expectOneToNine(assigned);
-    const Object& itself = assigned;
-    assigned = itself;
-    expectOneToNine(assigned);
-
-    Object moved(std::move(copy));
-    expectOneToNine(moved);
-    Object target;
-    target = std::move(moved);
-    expectOneToNine(target);
-}
 
 TEST(TransformationEquality, AllowsForTwelveDigitsOfEveryCoefficient)
 {

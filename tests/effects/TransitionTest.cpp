@@ -9,7 +9,6 @@ namespace {
 
 using testing::ElementsAre;
 using Testing::FieldText;
-using testing::IsEmpty;
 
 static_assert(Testing::isVirtualBase<Serialize::ISerializable, Transition::Object>);
 static_assert(Testing::isVirtualBase<PubSub::Object, Transition::Object>);
@@ -40,30 +39,12 @@ Transition::Object needing(const std::deque<ResourceRef>& resources)
     return transition;
 }
 
-TEST(Transition, LastsTwoSecondsAtFullVolumeByDefault)
-{
-    const Transition::Object transition;
-    EXPECT_EQ(transition.id, QString());
-    EXPECT_EQ(transition.tag, QString());
-    EXPECT_EQ(transition.description, QString());
-    EXPECT_EQ(transition.strategy, 0);
-    EXPECT_EQ(transition.type, 0);
-    EXPECT_EQ(transition.defaultDuration, MTime(2000));
-    EXPECT_THAT(transition.resources, IsEmpty());
-    EXPECT_EQ(transition.volume, 100);
-}
-
 TEST(Transition, IsMadeWithItsIdentifier)
 {
     const Transition::Object transition("Crossfade");
     EXPECT_EQ(transition.id, "Crossfade");
     EXPECT_THAT(Testing::defaultFields(transition), ElementsAre("tag", "description", "strategy", "type",
                                                                 "resources", "defaultDuration", "volume"));
-}
-
-TEST(Transition, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
 }
 
 TEST(Transition, NeedsNoMediaWithoutResources)
