@@ -24,7 +24,6 @@ class Freezer
 namespace {
 
 using testing::ElementsAre;
-using testing::IsEmpty;
 using Timeline::Clip;
 
 static_assert(Testing::isVirtualBase<Serialize::ISerializable, Editor::Object>);
@@ -53,58 +52,16 @@ Editor::Object fullEditor()
     return editor;
 }
 
-void expectFull(const Editor::Object& editor)
-{
-    EXPECT_EQ(editor.timeline, &someTimeline);
-    EXPECT_EQ(editor.reservedFirst, &others[0]);
-    EXPECT_EQ(editor.reservedSecond, &others[1]);
-    EXPECT_FALSE(editor.enabled);
-    EXPECT_EQ(editor.clips, (Clips{&clips[0], &clips[1]}));
-}
-
-/// Copies, moves and self-assignment, all in one.
-template <class T, class Expect>
-void expectCopies(T object, Expect expect)
-{
-    T copy(object);
-    expect(copy);
-    T assigned;
-    EXPECT_EQ(&(assigned = object), &assigned);
-    const T& itself = assigned;
-    assigned = itself;
-    expect(assigned);
-    const T moved(std::move(copy));
-    expect(moved);
-    T target;
-    EXPECT_EQ(&(target = std::move(object)), &target);
-    expect(target);
-}
-
-TEST(Editor, IsEnabledWithNothingToEditAtFirst)
+TEST(Editor, HasNothingToEditAtFirst)
 {
     const Editor::Object editor;
-    EXPECT_EQ(editor.timeline, nullptr);
-    EXPECT_EQ(editor.reservedFirst, nullptr);
-    EXPECT_EQ(editor.reservedSecond, nullptr);
-    EXPECT_TRUE(editor.enabled);
-    EXPECT_THAT(editor.clips, IsEmpty());
     EXPECT_FALSE(editor.canEdit());
     EXPECT_FALSE(editor.isValid());
 }
 
-TEST(Editor, SettersStoreAndReturnTheEditor)
+TEST(Editor, IsDisabledAndEnabledInAChain)
 {
     Editor::Object editor;
-    EXPECT_EQ(editor.setTimeline(&someTimeline), &editor);
-    EXPECT_EQ(editor.timeline, &someTimeline);
-    EXPECT_EQ(editor.setClips({&clips[0]}), &editor);
-    EXPECT_EQ(editor.clips, (Clips{&clips[0]}));
-    EXPECT_EQ(editor.setClips({&clips[1]}), &editor);
-    EXPECT_EQ(editor.clips, (Clips{&clips[1]}));
-    EXPECT_EQ(editor.setEnabled(false), &editor);
-    EXPECT_FALSE(editor.enabled);
-    EXPECT_EQ(editor.setEnabled(true), &editor);
-    EXPECT_TRUE(editor.enabled);
     EXPECT_EQ(editor.disable(), &editor);
     EXPECT_FALSE(editor.enabled);
     EXPECT_EQ(editor.enable(), &editor);
@@ -143,11 +100,6 @@ TEST(Editor, IsValidWithAllThreeOfItsObjects)
     EXPECT_FALSE(editor.isValid());
 }
 
-TEST(Editor, CopiesWhole)
-{
-    expectCopies(fullEditor(), expectFull);
-}
-
 TEST(Editor, IsMadeByName)
 {
     Testing::expectMadeByName<Editor::Object>("Editor::Object");
@@ -172,23 +124,6 @@ TEST(Editor, StoresItsSwitchAndItsClips)
 
 using Beats = std::map<MTime, bool>;
 
-TEST(Ruler, ShowsNothingAtFirst)
-{
-    const Ruler::Object ruler;
-    EXPECT_EQ(ruler.timeline, nullptr);
-    EXPECT_THAT(ruler.beats, IsEmpty());
-}
-
-TEST(Ruler, SettersStoreAndReturnTheRuler)
-{
-    Ruler::Object ruler;
-    EXPECT_EQ(ruler.setTimeline(&someTimeline), &ruler);
-    EXPECT_EQ(ruler.timeline, &someTimeline);
-    EXPECT_EQ(ruler.setBeats({{500, true}}), &ruler);
-    EXPECT_EQ(ruler.setBeats({{1000, true}, {250, false}}), &ruler);
-    EXPECT_EQ(ruler.beats, (Beats{{250, false}, {1000, true}}));
-}
-
 TEST(Ruler, KeepsItsBeatsWhenItIsGivenThem)
 {
     Ruler::Object ruler;
@@ -199,26 +134,9 @@ TEST(Ruler, KeepsItsBeatsWhenItIsGivenThem)
     EXPECT_EQ(ruler.beats.begin(), first);
 }
 
-TEST(Ruler, CopiesWhole)
-{
-    Ruler::Object full;
-    full.setTimeline(&someTimeline)->setBeats({{250, true}});
-    expectCopies(full, [](const Ruler::Object& ruler) {
-        EXPECT_EQ(ruler.timeline, &someTimeline);
-        EXPECT_EQ(ruler.beats, (Beats{{250, true}}));
-    });
-}
-
-TEST(FastTrack, IsEmptyAndOffAtFirst)
+TEST(FastTrack, IsOffAtFirst)
 {
     const FastTrack::Object track;
-    EXPECT_THAT(track.files, IsEmpty());
-    EXPECT_EQ(track.reservedWord, 0);
-    EXPECT_EQ(track.contentPath, QString());
-    EXPECT_FALSE(track.enabled);
-    EXPECT_FALSE(track.reservedFlag);
-    EXPECT_THAT(track.suppressors, IsEmpty());
-    EXPECT_THAT(track.freezers, IsEmpty());
     EXPECT_FALSE(track.active());
     EXPECT_FALSE(track.freezed());
 }
@@ -304,24 +222,6 @@ TEST(FastTrack, IsActiveOrNotWhetherFrozenOrNot)
     EXPECT_FALSE(track.freeze(&freezers[0])->active());
     EXPECT_TRUE(track.setEnabled(true)->active());
     EXPECT_TRUE(track.unfreeze(&freezers[0])->active());
-}
-
-TEST(FastTrack, CopiesWhole)
-{
-    FastTrack::Object full;
-    full.addFile(&files[1])->setContentPath(QStringLiteral("/content"))->setEnabled(true);
-    full.suppress(&suppressors[0])->freeze(&freezers[1]);
-    full.reservedWord = qint64(1) << 40;
-    full.reservedFlag = true;
-    expectCopies(full, [](const FastTrack::Object& track) {
-        EXPECT_EQ(track.files, (Files{&files[1]}));
-        EXPECT_EQ(track.reservedWord, qint64(1) << 40);
-        EXPECT_EQ(track.contentPath, QStringLiteral("/content"));
-        EXPECT_TRUE(track.enabled);
-        EXPECT_TRUE(track.reservedFlag);
-        EXPECT_THAT(track.suppressors, ElementsAre(&suppressors[0]));
-        EXPECT_THAT(track.freezers, ElementsAre(&freezers[1]));
-    });
 }
 
 } // namespace

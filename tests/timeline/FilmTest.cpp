@@ -12,7 +12,6 @@
 #include <gmock/gmock.h>
 #include <rapidcheck/gtest.h>
 
-#include <type_traits>
 #include <utility>
 
 namespace {
@@ -45,23 +44,6 @@ Film::Object fullFilm()
     return film;
 }
 
-void expectFull(const Film::Object& film)
-{
-    EXPECT_THAT(film.timelineBindings, ElementsAre(std::make_pair(&timelines[0], &timelines[1])));
-    EXPECT_THAT(film.clipBindings, ElementsAre(std::make_pair(&clips[1], &clips[0])));
-    EXPECT_EQ(film.expectedDuration, MTime(7000));
-    EXPECT_TRUE(film.fitDurationToAudio);
-    EXPECT_TRUE(film.cropMode);
-    EXPECT_EQ(film.nativeAudioVolume, -3);
-    EXPECT_EQ(film.detachedAudioVolume, 80);
-    EXPECT_THAT(film.transitionsList, ElementsAre(&transitions[1], &transitions[0], &transitions[1]));
-    EXPECT_TRUE(film.startTitlesEnabled);
-    EXPECT_TRUE(film.finalTitlesEnabled);
-    EXPECT_EQ(film.startTitles, &presets[0]);
-    EXPECT_EQ(film.finalTitles, &presets[1]);
-    EXPECT_EQ(film.background, &someFile);
-}
-
 void expectNoTitlesAndNoBackground(const Film::Object& film)
 {
     EXPECT_FALSE(film.startTitlesEnabled);
@@ -69,20 +51,6 @@ void expectNoTitlesAndNoBackground(const Film::Object& film)
     EXPECT_EQ(film.startTitles, nullptr);
     EXPECT_EQ(film.finalTitles, nullptr);
     EXPECT_EQ(film.background, nullptr);
-}
-
-TEST(Film, IsFiveSecondsOfNothingAtFirst)
-{
-    const Film::Object film;
-    EXPECT_THAT(film.timelineBindings, IsEmpty());
-    EXPECT_THAT(film.clipBindings, IsEmpty());
-    EXPECT_EQ(film.expectedDuration, MTime(5000));
-    EXPECT_FALSE(film.fitDurationToAudio);
-    EXPECT_FALSE(film.cropMode);
-    EXPECT_EQ(film.nativeAudioVolume, 0);
-    EXPECT_EQ(film.detachedAudioVolume, 0);
-    EXPECT_THAT(film.transitionsList, IsEmpty());
-    expectNoTitlesAndNoBackground(film);
 }
 
 TEST(Film, MayBeShorterThanItIsToBe)
@@ -93,7 +61,7 @@ TEST(Film, MayBeShorterThanItIsToBe)
     EXPECT_EQ(film.expectedDuration, MTime(1));
 }
 
-TEST(Film, SettersReturnTheFilm)
+TEST(Film, IsBoundInAChain)
 {
     Film::Object film;
     EXPECT_EQ(film.bindTimeline(&timelines[0], &timelines[1]), &film);
@@ -101,22 +69,6 @@ TEST(Film, SettersReturnTheFilm)
     EXPECT_EQ(film.unbind(&timelines[0]), &film);
     EXPECT_EQ(film.unbind(&clips[0]), &film);
     EXPECT_EQ(film.removeTree(&clips[0]), &film);
-    EXPECT_EQ(film.setExpectedDuration(1), &film);
-    EXPECT_EQ(film.setFitDurationToAudio(true), &film);
-    EXPECT_EQ(film.setCropMode(true), &film);
-    EXPECT_EQ(film.setNativeAudioVolume(1), &film);
-    EXPECT_EQ(film.setDetachedAudioVolume(1), &film);
-    EXPECT_EQ(film.setTransitionsList({}), &film);
-    EXPECT_EQ(film.setStartTitlesEnabled(true), &film);
-    EXPECT_EQ(film.setFinalTitlesEnabled(true), &film);
-    EXPECT_EQ(film.setStartTitles(nullptr), &film);
-    EXPECT_EQ(film.setFinalTitles(nullptr), &film);
-    EXPECT_EQ(film.setBackground(nullptr), &film);
-}
-
-TEST(Film, SettersStore)
-{
-    expectFull(fullFilm());
 }
 
 TEST(Film, TakesAListOfTransitionsOver)
@@ -126,22 +78,6 @@ TEST(Film, TakesAListOfTransitionsOver)
     Film::Object film;
     film.setTransitionsList(std::move(taken));
     EXPECT_EQ(&film.transitionsList.front(), first);
-}
-
-TEST(Film, CopiesWhole)
-{
-    Film::Object film = fullFilm();
-    Film::Object copy(film);
-    expectFull(copy);
-    Film::Object assigned;
-    EXPECT_EQ(&(assigned = film), &assigned);
-    const Film::Object& itself = assigned;
-    assigned = itself;
-    expectFull(assigned);
-    const Film::Object moved(std::move(copy));
-    expectFull(moved);
-    EXPECT_EQ(&(assigned = std::move(film)), &assigned);
-    expectFull(assigned);
 }
 
 TEST(FilmTimelines, OfAMasterHaveOneSlave)

@@ -28,30 +28,6 @@ Label everyFieldSet()
     return label;
 }
 
-TEST(Label, IsEmptyByDefault)
-{
-    const Label label;
-    EXPECT_EQ(label.timeline, nullptr);
-    EXPECT_EQ(label.position, MTime());
-    EXPECT_EQ(label.name, "");
-}
-
-TEST(Label, SettersStoreAndReturnTheLabel)
-{
-    Label label;
-    EXPECT_EQ(label.setPosition(-5), &label);
-    EXPECT_EQ(label.position, MTime(-5));
-    EXPECT_EQ(label.setName("there"), &label);
-    EXPECT_EQ(label.name, "there");
-    EXPECT_EQ(label.timeline, nullptr);
-}
-
-TEST(Label, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
-    EXPECT_EQ(Label(everyFieldSet()).timeline, &someTimeline);
-}
-
 TEST(Label, IsMadeByName)
 {
     Testing::expectMadeByName<Label>("Timeline::Label");

@@ -36,13 +36,6 @@ TEST(Link, ToBeReadNamesNone)
     EXPECT_EQ(link.offset, MTime());
 }
 
-TEST(Link, CopiesWhole)
-{
-    const Link link(&someClip, 250);
-    Testing::expectWholeCopies(link);
-    EXPECT_EQ(Link(link).master, &someClip);
-}
-
 TEST(Link, IsMadeByName)
 {
     Testing::expectMadeByName<Link>("Timeline::Link");

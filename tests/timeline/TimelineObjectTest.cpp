@@ -106,33 +106,6 @@ protected:
     Composition::Range range;
 };
 
-TEST_F(TimelineObject, IsEmptyAndOfFullHdAndCdSoundByDefault)
-{
-    const Timeline::Object timeline;
-    EXPECT_EQ(timeline.width, 1920);
-    EXPECT_EQ(timeline.height, 1080);
-    EXPECT_EQ(timeline.frameRateN, 30000);
-    EXPECT_EQ(timeline.frameRateD, 1001);
-    EXPECT_EQ(timeline.aspectX, 1);
-    EXPECT_EQ(timeline.aspectY, 1);
-    EXPECT_EQ(timeline.channelLayout, 2);
-    EXPECT_EQ(timeline.sampleRate, 44100);
-    EXPECT_EQ(timeline.sampleFormat, 1);
-
-    EXPECT_EQ(timeline.scope, 0);
-    EXPECT_TRUE(timeline.reservedText.isEmpty());
-    EXPECT_EQ(timeline.composition, nullptr);
-    EXPECT_TRUE(timeline.markerUpdateEnabled);
-    EXPECT_THAT(timeline.clips, IsEmpty());
-    EXPECT_THAT(timeline.links, IsEmpty());
-    EXPECT_THAT(timeline.trackingLinks, IsEmpty());
-    EXPECT_THAT(timeline.transitions, IsEmpty());
-    EXPECT_THAT(timeline.tracks, IsEmpty());
-    EXPECT_THAT(timeline.exportRanges, IsEmpty());
-    EXPECT_EQ(timeline.reservedFirst, 0);
-    EXPECT_EQ(timeline.reservedSecond, 0);
-}
-
 TEST_F(TimelineObject, StoresItsStateAndGivesItself)
 {
     Timeline::Object timeline;
@@ -150,37 +123,6 @@ TEST_F(TimelineObject, StoresItsStateAndGivesItself)
     EXPECT_THAT(timeline.exportRanges, ElementsAre(&second));
     EXPECT_EQ(timeline.removeExportRange(&range), &timeline);
     EXPECT_THAT(timeline.exportRanges, ElementsAre(&second));
-}
-
-TEST_F(TimelineObject, CopiesAndMovesWhole)
-{
-    const Timeline::Object original = withEveryFieldSet();
-    expectEveryFieldSet(original);
-    Timeline::Object copy(original);
-    expectEveryFieldSet(copy);
-
-    Timeline::Object assigned;
-    EXPECT_EQ(&(assigned = original), &assigned);
-    expectEveryFieldSet(assigned);
-    const Timeline::Object& itself = assigned;
-    assigned = itself;
-    expectEveryFieldSet(assigned);
-
-    Timeline::Object moved(std::move(copy));
-    expectEveryFieldSet(moved);
-    Timeline::Object target;
-    EXPECT_EQ(&(target = std::move(moved)), &target);
-    expectEveryFieldSet(target);
-    expectEveryFieldSet(original);
-
-    target = Timeline::Object();
-    EXPECT_EQ(Testing::Dump::of(target), Testing::Dump::of(Timeline::Object()));
-    EXPECT_EQ(target.scope, 0);
-    EXPECT_TRUE(target.reservedText.isEmpty());
-    EXPECT_EQ(target.reservedFirst, 0);
-    EXPECT_EQ(target.reservedSecond, 0);
-    EXPECT_TRUE(target.Media::Video::label.isEmpty());
-    EXPECT_TRUE(target.Media::Audio::label.isEmpty());
 }
 
 TEST_F(TimelineObject, ACopyIsEditedOnItsOwn)

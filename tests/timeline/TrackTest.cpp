@@ -52,40 +52,11 @@ void expectNothingButTheType(const Track& track)
     EXPECT_EQ(track.timeline, nullptr);
 }
 
-TEST(Track, IsUsedFromTheStart)
+TEST(Track, IsMadeOfAType)
 {
-    EXPECT_EQ(Track().type, 0);
-    expectNothingButTheType(Track());
-    EXPECT_EQ(Track(QuizTrack).type, QuizTrack);
-    expectNothingButTheType(Track(QuizTrack));
-}
-
-TEST(Track, SettersStoreAndReturnTheTrack)
-{
-    Track track;
-    EXPECT_EQ(track.setType(AudioTrack), &track);
-    EXPECT_EQ(track.type, AudioTrack);
-    EXPECT_EQ(track.setMuted(true), &track);
-    EXPECT_TRUE(track.muted);
-    EXPECT_FALSE(track.hidden || track.linked || track.gapless);
-    EXPECT_EQ(track.setHidden(true), &track);
-    EXPECT_TRUE(track.hidden);
-    EXPECT_FALSE(track.linked || track.gapless);
-    EXPECT_EQ(track.setLinked(true), &track);
-    EXPECT_TRUE(track.linked);
-    EXPECT_FALSE(track.gapless);
-    EXPECT_EQ(track.setGapless(true), &track);
-    EXPECT_TRUE(track.gapless);
-    EXPECT_EQ(track.setUsed(false), &track);
-    EXPECT_FALSE(track.used);
-    EXPECT_EQ(track.setTimeline(&someTimeline), &track);
-    EXPECT_EQ(track.timeline, &someTimeline);
-}
-
-TEST(Track, CopiesWhole)
-{
-    Testing::expectWholeCopies(everyFieldSet());
-    EXPECT_EQ(Track(everyFieldSet()).timeline, &someTimeline);
+    const Track track(QuizTrack);
+    EXPECT_EQ(track.type, QuizTrack);
+    expectNothingButTheType(track);
 }
 
 TEST(Track, IsMadeByName)

@@ -24,25 +24,11 @@ static_assert(!std::is_base_of_v<PubSub::Object, TrackingLinkInfo>);
 const Clip someClip;
 const Clip otherClip;
 
-TEST(TrackedObject, NamesNothingByDefault)
-{
-    const TrackedObject object;
-    EXPECT_EQ(object.clip, nullptr);
-    EXPECT_EQ(object.trackingId, "");
-}
-
 TEST(TrackedObject, NamesAClipAndATracking)
 {
     const TrackedObject object(&someClip, "face");
     EXPECT_EQ(object.clip, &someClip);
     EXPECT_EQ(object.trackingId, "face");
-}
-
-TEST(TrackedObject, CopiesWhole)
-{
-    const TrackedObject object(&someClip, "face");
-    Testing::expectWholeCopies(object);
-    EXPECT_EQ(TrackedObject(object).clip, &someClip);
 }
 
 TEST(TrackedObject, IsMadeByName)
@@ -69,37 +55,12 @@ TEST(TrackedObject, IsEqualInBothFields)
     }
 }
 
-TEST(TrackingLinkInfo, NamesNothingByDefault)
-{
-    const TrackingLinkInfo info;
-    EXPECT_TRUE(info.trackedObject == TrackedObject());
-    EXPECT_EQ(info.objectRelativeOffset.x(), 0.0);
-    EXPECT_EQ(info.objectRelativeOffset.y(), 0.0);
-}
-
 TEST(TrackingLinkInfo, NamesAnObjectAndAnOffset)
 {
     const TrackingLinkInfo info(TrackedObject(&someClip, "face"), QPointF(0.5, -0.25));
     EXPECT_TRUE(info.trackedObject == TrackedObject(&someClip, "face"));
     EXPECT_EQ(info.objectRelativeOffset.x(), 0.5);
     EXPECT_EQ(info.objectRelativeOffset.y(), -0.25);
-}
-
-TEST(TrackingLinkInfo, SettersStoreAndReturnTheRecord)
-{
-    TrackingLinkInfo info;
-    EXPECT_EQ(info.setTrackedObject(TrackedObject(&someClip, "face")), &info);
-    EXPECT_TRUE(info.trackedObject == TrackedObject(&someClip, "face"));
-    EXPECT_EQ(info.setObjectRelativeOffset(QPointF(3, 4)), &info);
-    EXPECT_EQ(info.objectRelativeOffset.x(), 3.0);
-    EXPECT_EQ(info.objectRelativeOffset.y(), 4.0);
-}
-
-TEST(TrackingLinkInfo, CopiesWhole)
-{
-    const TrackingLinkInfo info(TrackedObject(&someClip, "face"), QPointF(0.5, -0.25));
-    Testing::expectWholeCopies(info);
-    EXPECT_EQ(TrackingLinkInfo(info).trackedObject.clip, &someClip);
 }
 
 TEST(TrackingLinkInfo, IsMadeByName)
