@@ -16,11 +16,6 @@ std::array<double, 4> edgesOf(const Rect& rect)
     return {rect.left, rect.top, rect.right, rect.bottom};
 }
 
-TEST(Rect, IsZeroByDefault)
-{
-    EXPECT_EQ((std::array<double, 4>{0, 0, 0, 0}), edgesOf(Rect()));
-}
-
 TEST(Rect, TakesLeftTopRightBottom)
 {
     EXPECT_EQ((std::array<double, 4>{1, 2, 3, 4}), edgesOf(Rect(1, 2, 3, 4)));
@@ -57,19 +52,6 @@ TEST(Rect, EqualsItselfWhateverItHolds)
     const Rect copy = odd;
     EXPECT_TRUE(odd == odd);
     EXPECT_FALSE(odd == copy);
-}
-
-TEST(Rect, CopiesAndAssignsEveryEdge)
-{
-    Rect rect(1, 2, 3, 4);
-    const Rect copy = rect;
-    Rect assigned;
-    assigned = rect;
-    Rect& self = rect;
-    rect = self;
-    EXPECT_EQ((std::array<double, 4>{1, 2, 3, 4}), edgesOf(copy));
-    EXPECT_EQ((std::array<double, 4>{1, 2, 3, 4}), edgesOf(assigned));
-    EXPECT_EQ((std::array<double, 4>{1, 2, 3, 4}), edgesOf(rect));
 }
 
 } // namespace
