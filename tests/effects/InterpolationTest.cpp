@@ -100,12 +100,10 @@ TEST(TransformationInterpolation, TurnsBackwardsByHalfATurn)
     expectMatrix(envelope.valueAt(0.5).matrix, {0, -1, 0, 1, 0, 0, 0, 0, 1});
 }
 
-TEST(TransformationInterpolation, CountsItsAnglesFromZeroToAWholeTurn)
+TEST(TransformationInterpolation, AHalfTurnBackwardsEndsAsOneForwards)
 {
-    // A whole turn is none, and half a turn backwards is one forwards: neither leaves a rest of the sine.
-    const Transform threeQuarters(0, -1, 0, 1, 0, 0, 0, 0, 1);
+    // Qt knows the sine of 180 degrees exactly, and that of -180 only nearly.
     const Transform half(-1, 0, 0, 0, -1, 0, 0, 0, 1);
-    EXPECT_EQ(between(threeQuarters, Transform(), 1).m12, 0.0);
     EXPECT_EQ(between(Transform(), half, 1).m12, 0.0);
 }
 
