@@ -179,20 +179,32 @@ struct Life
 };
 
 template <class C>
-constexpr Life lifeOf{
-    sizeof(C),
-    alignof(C),
-    [](void* memory) { ::new (memory) C; },
-    [](void* memory, const void* from) { ::new (memory) C(*static_cast<const C*>(from)); },
-    [](void* memory, void* from) { ::new (memory) C(std::move(*static_cast<C*>(from))); },
-    [](void* object) { static_cast<C*>(object)->~C(); },
-    [](void* object, const void* from) -> const void* {
-        return &(*static_cast<C*>(object) = *static_cast<const C*>(from));
-    },
-    [](void* object, void* from) -> const void* {
-        return &(*static_cast<C*>(object) = std::move(*static_cast<C*>(from)));
-    },
-};
+constexpr Life lifeFrom(void (*make)(void* memory))
+{
+    return {sizeof(C),
+            alignof(C),
+            make,
+            [](void* memory, const void* from) { ::new (memory) C(*static_cast<const C*>(from)); },
+            [](void* memory, void* from) { ::new (memory) C(std::move(*static_cast<C*>(from))); },
+            [](void* object) { static_cast<C*>(object)->~C(); },
+            [](void* object, const void* from) -> const void* {
+                return &(*static_cast<C*>(object) = *static_cast<const C*>(from));
+            },
+            [](void* object, void* from) -> const void* {
+                return &(*static_cast<C*>(object) = std::move(*static_cast<C*>(from)));
+            }};
+}
+
+template <class C>
+constexpr Life lifeOf = lifeFrom<C>([](void* memory) { ::new (memory) C; });
+
+/// Of a class whose objects are made with arguments.
+template <class C>
+const Life& lifeBy(void (*make)(void* memory))
+{
+    static const Life life = lifeFrom<C>(make);
+    return life;
+}
 
 /// The way from an object to one of its bases.
 using Up = void* (*)(void* object);
@@ -278,8 +290,15 @@ template <class C>
 class ClassOf : public ClassTable
 {
 public:
-    explicit ClassOf(const char* className, Returns settersReturn = Returns::Pointer)
-        : ClassTable(className, FieldTests::nameInArchive<C>(), lifeOf<C>, settersReturn)
+    explicit ClassOf(const char* className, Returns settersReturn = Returns::Pointer,
+                     const Life& classLife = lifeOf<C>)
+        : ClassTable(className, FieldTests::nameInArchive<C>(), classLife, settersReturn)
+    {}
+
+    /// Of a class without setters that has no default object: its defaults are those of the object that is
+    /// made here.
+    ClassOf(const char* className, void (*make)(void* memory))
+        : ClassOf(className, Returns::Nothing, lifeBy<C>(make))
     {}
 
     /// All rows of a base.
@@ -329,5 +348,7 @@ std::vector<ClassTable> effectClasses();
 std::vector<ClassTable> analysisClasses();
 std::vector<ClassTable> libraryClasses();
 std::vector<ClassTable> serviceClasses();
+/// Messages, what they are made of, and those who ask with them.
+std::vector<ClassTable> messageClasses();
 
 } // namespace FieldTests

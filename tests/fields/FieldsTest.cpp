@@ -26,7 +26,7 @@ const std::vector<ClassTable>& classes()
     static const std::vector<ClassTable> all = [] {
         std::vector<ClassTable> joined;
         for (const auto part : {valueClasses, timelineClasses, mediaClasses, effectClasses, analysisClasses,
-                                libraryClasses, serviceClasses}) {
+                                libraryClasses, serviceClasses, messageClasses}) {
             const std::vector<ClassTable> tables = part();
             joined.insert(joined.end(), tables.begin(), tables.end());
         }

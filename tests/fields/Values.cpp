@@ -37,6 +37,11 @@ std::vector<QPointF> Values<QPointF>::all()
     return values;
 }
 
+bool Values<QPointF>::same(const QPointF& a, const QPointF& b)
+{
+    return FieldTests::same(a.x(), b.x()) && FieldTests::same(a.y(), b.y());
+}
+
 std::vector<Types::Range> Values<Types::Range>::all()
 {
     return {{2, 5}, {5, 2}, {-1, -1}, {std::numeric_limits<qint64>::max(), 0}, {0, 0}};
@@ -50,9 +55,21 @@ std::vector<Decibel> Values<Decibel>::all()
     return values;
 }
 
+bool Values<Decibel>::same(const Decibel& a, const Decibel& b)
+{
+    return FieldTests::same(a.level(), b.level());
+}
+
 std::vector<MotionTracking::OverlayLinkInfo> Values<MotionTracking::OverlayLinkInfo>::all()
 {
     return {{"tracking", {0.25, -3.0}, [] {}}, {"", {0.0, 0.0}, [] {}}, {"tracking", {0.0, 0.0}, nullptr}};
+}
+
+bool Values<MotionTracking::OverlayLinkInfo>::same(const MotionTracking::OverlayLinkInfo& a,
+                                                   const MotionTracking::OverlayLinkInfo& b)
+{
+    return a.trackingId == b.trackingId && FieldTests::same(a.offset, b.offset) &&
+           bool(a.callback) == bool(b.callback);
 }
 
 } // namespace FieldTests

@@ -11,6 +11,7 @@
 
 #include <QMap>
 #include <QPointF>
+#include <QSet>
 #include <QString>
 
 #include <algorithm>
@@ -28,6 +29,17 @@
 /// Values to try a field with, by its type, and whether two values are the same.
 namespace FieldTests {
 
+/// A list of values of every kind that a careful setter might refuse. Where a type's own equality won't do,
+/// there is `same` as well.
+template <class T>
+struct Values;
+
+template <class T, class = void>
+constexpr bool comparesValues = false;
+template <class T>
+constexpr bool
+    comparesValues<T, std::void_t<decltype(Values<T>::same(std::declval<T>(), std::declval<T>()))>> = true;
+
 template <class T, class = void>
 constexpr bool isContainer = false;
 template <class T>
@@ -37,23 +49,14 @@ constexpr bool isContainer<T, std::void_t<typename T::value_type, decltype(std::
 template <class T>
 bool same(const T& a, const T& b);
 
-inline bool same(const QPointF& a, const QPointF& b)
-{
-    return same(a.x(), b.x()) && same(a.y(), b.y());
-}
-
-inline bool same(const Decibel& a, const Decibel& b)
-{
-    return same(a.level(), b.level());
-}
-
-inline bool same(const MotionTracking::OverlayLinkInfo& a, const MotionTracking::OverlayLinkInfo& b)
-{
-    return a.trackingId == b.trackingId && same(a.offset, b.offset) && bool(a.callback) == bool(b.callback);
-}
-
 template <class K, class V>
 bool same(const QMap<K, V>& a, const QMap<K, V>& b)
+{
+    return a == b;
+}
+
+template <class T>
+bool same(const QSet<T>& a, const QSet<T>& b)
 {
     return a == b;
 }
@@ -71,6 +74,8 @@ bool same(const T& a, const T& b)
 {
     if constexpr (std::is_floating_point_v<T>) {
         return a == b || (std::isnan(a) && std::isnan(b));
+    } else if constexpr (comparesValues<T>) {
+        return Values<T>::same(a, b);
     } else if constexpr (std::is_base_of_v<Serialize::ISerializable, T>) {
         return Testing::Dump::of(a) == Testing::Dump::of(b);
     } else if constexpr (isContainer<T>) {
@@ -101,7 +106,6 @@ std::vector<T> extremes()
 
 Testing::Filler& filler();
 
-/// A list of values of every kind that a careful setter might refuse.
 template <class T>
 struct Values
 {
@@ -179,6 +183,18 @@ struct Values<QMap<K, V>>
 };
 
 template <class T>
+struct Values<QSet<T>>
+{
+    static std::vector<QSet<T>> all()
+    {
+        QSet<T> several;
+        for (const T& value : Values<T>::all())
+            several.insert(value);
+        return {several, {T()}, {}};
+    }
+};
+
+template <class T>
 struct Values<std::shared_ptr<T>>
 {
     static std::vector<std::shared_ptr<T>> all()
@@ -207,6 +223,7 @@ template <>
 struct Values<QPointF>
 {
     static std::vector<QPointF> all();
+    static bool same(const QPointF& a, const QPointF& b);
 };
 template <>
 struct Values<Types::Range>
@@ -217,11 +234,13 @@ template <>
 struct Values<Decibel>
 {
     static std::vector<Decibel> all();
+    static bool same(const Decibel& a, const Decibel& b);
 };
 template <>
 struct Values<MotionTracking::OverlayLinkInfo>
 {
     static std::vector<MotionTracking::OverlayLinkInfo> all();
+    static bool same(const MotionTracking::OverlayLinkInfo& a, const MotionTracking::OverlayLinkInfo& b);
 };
 
 } // namespace FieldTests
