@@ -290,6 +290,29 @@ TEST_F(ViewTest, AnOwnerMayAdjustARequestedChangeAndTheRequestersValueStaysAsItI
     EXPECT_EQ(wanted.value, 2);
 }
 
+TEST_F(ViewTest, TheValueOfAGrantedChangeIsTheOldOneAfterwards)
+{
+    class Keeper : public TracedView
+    {
+    public:
+        using TracedView::TracedView;
+        int left = -1;
+
+    protected:
+        void changeRequested(Note* note, Note* value) override
+        {
+            TracedView::changeRequested(note, value);
+            left = value->value;
+        }
+    };
+    Keeper owner(trace, "owner");
+    owner.own(&a())->setValue(4);
+    Note wanted(2);
+    PubSub::publish(Message::Types::Change<Note>(&a(), &wanted));
+    EXPECT_EQ(a().value, 2);
+    EXPECT_EQ(owner.left, 4);
+}
+
 TEST_F(ViewTest, AnOwnersOwnOperationsAreNotRequests)
 {
     StubbornView owner(trace, "owner");

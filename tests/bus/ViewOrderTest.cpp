@@ -97,6 +97,39 @@ TEST_F(ViewTest, AnObserverHearsOfTheObjectUntilItsDepartureIsOver)
     EXPECT_THAT(trace.take(), Contains("observer changed a: b=0"));
 }
 
+/// The announcement of a departure comes before the owner stops answering.
+TEST_F(ViewTest, AnOwnerThatRemovesStillAnswersThoseWhoLetGo)
+{
+    TracedView owner(trace, "owner"), observer(trace, "observer");
+    owner.own(&a());
+    observer.observe(&a());
+    observer.onRemoved = [&] { PubSub::publish(Message::Types::Change<Note>(&a(), &b())); };
+    b().value = 9;
+    owner.remove(&a());
+    EXPECT_EQ(a().value, 9);
+}
+
+TEST_F(ViewTest, AnOwnerOfARemovedObjectDoesNotAnswerAnAddOfIt)
+{
+    TracedView owner(trace, "owner"), observer(trace, "observer"), client(trace, "client");
+    for (const bool byOwner : {true, false}) {
+        owner.own(&a());
+        observer.observe(&a());
+        (byOwner ? owner : observer).remove(&a());
+        client.add(&a());
+        EXPECT_FALSE(owner.isObserved(&a())) << byOwner;
+    }
+}
+
+TEST_F(ViewTest, AWatcherOfNewObjectsHearsTheirChangesFromTheirArrivalOn)
+{
+    TracedView owner(trace, "owner"), watcher(trace, "watcher");
+    watcher.observeNew();
+    watcher.onAdded = [&] { owner.change(&a())->setValue(7); };
+    owner.own(&a());
+    EXPECT_THAT(trace.take(), Contains("watcher changed a: 0"));
+}
+
 TEST_F(ViewTest, AForgottenObjectIsNotHeardOfFromItsDepartureOn)
 {
     TracedView owner(trace, "owner"), observer(trace, "observer");
