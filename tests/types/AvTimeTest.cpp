@@ -24,6 +24,13 @@ TEST(AvTime, IsRoundedWhereAskedFor)
     EXPECT_EQ(MTime(-2), Types::fromAvTimeRound(-1500));
 }
 
+TEST(AvTime, IsRoundedByWayOfADouble)
+{
+    // Above 2^53 doubles stand 2 apart, and 9 007 199 254 741 499 becomes ...500.
+    EXPECT_EQ(MTime(9007199254742), Types::fromAvTimeRound(9007199254741499));
+    EXPECT_EQ(MTime(9007199254741), Types::fromAvTime(9007199254741499));
+}
+
 TEST(AvTime, CountsMicroseconds)
 {
     EXPECT_EQ(1500000, Types::toAvTime(MTime(1500)));

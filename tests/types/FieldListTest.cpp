@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
+#include <EditorModel/bus/PubSub.h>
 #include <EditorModel/persistence/Fields.h>
 #include <EditorModel/types/Pen.h>
 #include <EditorModel/types/Rect.h>
@@ -15,6 +16,11 @@
 #include <vector>
 
 namespace {
+
+// Values are parts of other objects, and not watched by themselves.
+static_assert(!std::is_base_of_v<PubSub::Object, Types::Transform>);
+static_assert(!std::is_base_of_v<PubSub::Object, Types::Pen>);
+static_assert(!std::is_base_of_v<PubSub::Object, Types::Rect>);
 
 using Field = std::pair<std::string, double>;
 
