@@ -14,7 +14,6 @@ namespace {
 
 using EditorCollection::PersistentItem;
 using ::testing::ElementsAre;
-using ::testing::IsEmpty;
 using ::testing::Pair;
 
 /// The archive names, by hand.
@@ -88,17 +87,6 @@ struct ElementName
 
 TYPED_TEST_SUITE(ItemOf, Elements, ElementName);
 
-TYPED_TEST(ItemOf, IsEmptyByDefault)
-{
-    const PersistentItem<TypeParam> empty;
-    EXPECT_EQ(empty.uniqueId, QString());
-    EXPECT_EQ(empty.item, nullptr);
-    EXPECT_EQ(empty.preview, nullptr);
-    EXPECT_THAT(empty.categories, IsEmpty());
-    EXPECT_EQ(empty.collectionId, QString());
-    EXPECT_THAT(empty.customStrings, IsEmpty());
-}
-
 TYPED_TEST(ItemOf, IsMadeByItsName)
 {
     Testing::expectMadeByName<PersistentItem<TypeParam>>(itemName(this->element));
@@ -108,14 +96,6 @@ TYPED_TEST(ItemOf, WritesItsFieldsInOrder)
 {
     EXPECT_THAT(Testing::fieldKeys(this->item),
                 ElementsAre("uniqueId", "item", "preview", "categories", "collectionId", "customStrings"));
-}
-
-TYPED_TEST(ItemOf, CopiesWholeAndNamesTheSameElementAndPicture)
-{
-    Testing::expectWholeCopies(this->item);
-    const PersistentItem<TypeParam> copy(this->item);
-    EXPECT_EQ(copy.item, &this->element);
-    EXPECT_EQ(copy.preview, this->item.preview);
 }
 
 TYPED_TEST(ItemOf, ComesBackWithItsElement)

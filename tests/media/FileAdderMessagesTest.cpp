@@ -53,27 +53,11 @@ TEST(FileAdderTimelineContext, NamesAStrategy)
                   false, 7);
 }
 
-TEST(FileAdderTimelineContext, CopiesWhole)
-{
-    const TimelineContext full = fullContext();
-    expectFullContext(TimelineContext(full));
-    TimelineContext assigned(&otherTimeline);
-    EXPECT_EQ(&(assigned = full), &assigned);
-    expectFullContext(assigned);
-    const TimelineContext& itself = assigned;
-    assigned = itself;
-    expectFullContext(assigned);
-}
-
 TEST(FileAdderResourceTableContext, NamesATable)
 {
     const ResourceTableContext context(&someTable);
     EXPECT_EQ(context.table, &someTable);
-    ResourceTableContext assigned(nullptr);
-    EXPECT_EQ(assigned.table, nullptr);
-    assigned = context;
-    EXPECT_EQ(assigned.table, &someTable);
-    EXPECT_EQ(ResourceTableContext(context).table, &someTable);
+    EXPECT_EQ(ResourceTableContext(nullptr).table, nullptr);
 }
 
 TEST(FileAdderContexts, AreAbsentAtFirst)
@@ -134,23 +118,12 @@ TEST(FileAdderContexts, CopyWhole)
 
 TEST(FileAdderMessages, HoldWhatTheyAreMadeWith)
 {
-    const AddMediaFiles request(twoFiles, source(5), allContexts());
-    expectRequest(request);
-    expectRequest(AddMediaFiles(request));
-    AddMediaFiles assigned({}, source(0), {});
-    EXPECT_EQ(&(assigned = request), &assigned);
-    const AddMediaFiles& itself = assigned;
-    assigned = itself;
-    expectRequest(assigned);
+    expectRequest(AddMediaFiles(twoFiles, source(5), allContexts()));
 
     const AddMediaFilesResult answer(result(6), twoFiles);
-    AddMediaFilesResult other(result(0), {});
-    EXPECT_EQ(&(other = answer), &other);
-    for (const AddMediaFilesResult& each : {answer, other}) {
-        EXPECT_EQ(each.sender, globalObject());
-        EXPECT_EQ(each.result, 6);
-        EXPECT_EQ(each.files, twoFiles);
-    }
+    EXPECT_EQ(answer.sender, globalObject());
+    EXPECT_EQ(answer.result, 6);
+    EXPECT_EQ(answer.files, twoFiles);
 }
 
 TEST(FileAdderMessages, TakeTheirContextsByValue)

@@ -59,30 +59,6 @@ std::vector<std::string> defaultFields(const T& object)
     return same;
 }
 
-/// For a class all of whose fields are written: copies are whole, however they are made.
-template <class T>
-void expectWholeCopies(const T& object)
-{
-    ASSERT_THAT(defaultFields(object), testing::IsEmpty()) << "the object is to have every field set";
-    const std::string whole = Dump::of(object);
-
-    T copy(object);
-    EXPECT_EQ(Dump::of(copy), whole);
-    T assigned;
-    EXPECT_EQ(&(assigned = object), &assigned);
-    EXPECT_EQ(Dump::of(assigned), whole);
-    const T& itself = assigned;
-    assigned = itself;
-    EXPECT_EQ(Dump::of(assigned), whole);
-
-    T moved(std::move(copy));
-    EXPECT_EQ(Dump::of(moved), whole);
-    T target;
-    EXPECT_EQ(&(target = std::move(moved)), &target);
-    EXPECT_EQ(Dump::of(target), whole);
-    EXPECT_EQ(Dump::of(object), whole);
-}
-
 /// Objects of the class answer to the name, and the name makes one.
 template <class T>
 void expectMadeByName(const std::string& name)
