@@ -41,6 +41,15 @@ TEST(Range, StoresItsEndsInAnyOrder)
     EXPECT_TRUE(range.empty());
 }
 
+TEST(Range, FromATimeToItselfIsEmpty)
+{
+    EXPECT_TRUE(Range(3, 3).empty());
+    EXPECT_EQ(MTime(0), Range(3, 3).length());
+    EXPECT_FALSE(Range(3, 3).contains(3));
+    EXPECT_FALSE(Range(3, 4).empty());
+    EXPECT_EQ(MTime(1), Range(3, 4).length());
+}
+
 TEST(Range, HoldsItsStartAndNotItsEnd)
 {
     const Range range(2, 5);
