@@ -6,6 +6,7 @@
 #include <gmock/gmock.h>
 
 #include <memory>
+#include <stdexcept>
 #include <string>
 #include <typeinfo>
 #include <vector>
@@ -126,6 +127,14 @@ TEST(Registry, OneNameServesBothRoutes)
         EXPECT_TRUE(type->info == row.info) << row.name;
         EXPECT_EQ(type->version, 0u) << row.name;
     }
+}
+
+TEST(Registry, RefusesANameThatIsTaken)
+{
+    const Serialize::BaseCreator* const clips = Serialize::findCreator("Timeline::Clip");
+    const Timeline::Label::Creator labels;
+    EXPECT_THROW(Serialize::Registrator("Timeline::Clip", &labels), std::logic_error);
+    EXPECT_EQ(Serialize::findCreator("Timeline::Clip"), clips);
 }
 
 TEST(Registry, KnowsNoCreatorOfWhatIsWrittenInItsPlaceOnly)
