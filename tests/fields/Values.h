@@ -67,8 +67,8 @@ bool same(const std::pair<A, B>& a, const std::pair<A, B>& b)
     return same(a.first, b.first) && same(a.second, b.second);
 }
 
-/// Exact where an operator of the type is not: nothing is fuzzy, no field is passed over, and a not-a-number
-/// is the same as another.
+/// Exact where an operator of the type is not: nothing is fuzzy, no stored field is passed over, and a
+/// not-a-number is the same as another.
 template <class T>
 bool same(const T& a, const T& b)
 {
