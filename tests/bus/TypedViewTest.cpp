@@ -4,6 +4,9 @@
 #include <EditorModel/bus/Preview.h>
 #include <EditorModel/services/Task.h>
 
+#include <type_traits>
+#include <utility>
+
 namespace {
 
 using namespace BusTests;
@@ -86,6 +89,15 @@ private:
         lines.push_back(what + " " + std::to_string(note->value));
     }
 };
+
+// The operations are for the module that derives from the view, which decides what it shows of them.
+template <class View, class = void>
+constexpr bool observesInPublic = false;
+template <class View>
+constexpr bool observesInPublic<View, std::void_t<decltype(std::declval<View&>().noteObserve(nullptr))>> =
+    true;
+static_assert(!observesInPublic<NoteViewBase>);
+static_assert(observesInPublic<Module>);
 
 TEST(TypedView, HandsEveryCallbackOnUnderItsOwnName)
 {
