@@ -156,6 +156,13 @@ TEST(MTimeRounding, MultipliesAndDivides)
     EXPECT_EQ(MTime(-200), MTime(100).divRound(-0.5));
 }
 
+TEST(MTimeRounding, DividesAndDoesNotMultiplyByTheInverse)
+{
+    // 49 times a 98th, which no double holds, falls just short of a half.
+    EXPECT_EQ(MTime(1), MTime(49).divRound(98.0));
+    EXPECT_EQ(MTime(-1), MTime(49).divRound(-98.0));
+}
+
 TEST(MTimeRounding, MakesZeroOfNotANumber)
 {
     EXPECT_EQ(MTime(), MTime::fromMsRound(NOT_A_NUMBER));
