@@ -183,11 +183,27 @@ TEST(JsonArchive, SingleValuesAreSavedAndLoadedByTheirTypes)
     expectNode(qint64(-5000000000), -5000000000);
 }
 
+TEST(JsonArchive, NumbersBeyondEitherEndOfTheirTypeAreRefused)
+{
+    using Serialize::Json::detail::load;
+    int whole = 0;
+    load(json(-2147483648), whole);
+    EXPECT_EQ(whole, std::numeric_limits<int>::min());
+    EXPECT_THROW(load(json(-2147483649), whole), std::runtime_error);
+    EXPECT_THROW(load(json(2147483648), whole), std::runtime_error);
+    unsigned int colour = 0;
+    EXPECT_THROW(load(json(-1), colour), std::runtime_error);
+    EXPECT_THROW(load(json(4294967296), colour), std::runtime_error);
+    qint64 large = 0;
+    EXPECT_THROW(load(json(9223372036854775808u), large), std::runtime_error);
+}
+
 TEST(JsonArchive, ANodeGivesTheIdentityOfItsObjectOrOfTheOneThatItMentions)
 {
     using Serialize::Json::getObjectId;
     EXPECT_EQ(getObjectId(json::parse(R"({"$meta": {"class": "Sample::Leaf", "id": 4}, "number": 4})")), 4u);
     EXPECT_EQ(getObjectId(json::parse(R"({"$meta": {"ref": 5}})")), 5u);
+    EXPECT_EQ(getObjectId(json::parse(R"({"$meta": {"id": 0}})")), 0u);
     for (const char* const without :
          {R"({"$meta": {"class": "Sample::Leaf"}})", R"({"id": 4})", "[4]", "4", "null"})
         EXPECT_EQ(getObjectId(json::parse(without)), std::nullopt) << without;
