@@ -128,6 +128,8 @@ TEST(DecibelOrder, IsPlainWhenStrictAndFuzzyWhenNot)
     EXPECT_TRUE(level < slightlyMore);
     EXPECT_TRUE(slightlyMore > level);
     EXPECT_FALSE(level > slightlyMore);
+    EXPECT_FALSE(level < level);
+    EXPECT_FALSE(level > level);
     EXPECT_TRUE(slightlyMore <= level);
     EXPECT_TRUE(level >= slightlyMore);
     EXPECT_FALSE(dB(2.0) <= level);
