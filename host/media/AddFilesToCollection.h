@@ -10,7 +10,8 @@
 namespace Host {
 
 /// Asks for media files, which the asker has had opened, to be listed in the user's collection. It has no
-/// answer: the collection shows what came of it. The sender is EditorCollection::globalObject().
+/// answer but CollectingFailed: the collection shows what came of it. The sender is
+/// EditorCollection::globalObject().
 class AddFilesToCollection : public Message::Types::Request<EditorCollection::Object>
 {
 public:

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "host/media/CollectionKeeper.h"
 
+#include "host/media/CollectingFailed.h"
 #include "host/media/FileFacts.h"
 
 #include <EditorModel/library/CollectionIds.h>
@@ -46,19 +47,25 @@ CollectionKeeper::CollectionKeeper() : m_own(std::make_unique<UserObject>()), m_
 
 CollectionKeeper::CollectionKeeper(UserObject* collection) : m_collection(collection)
 {
-    own(m_collection);
+    if (enumerateAll().count(collection) == 0) {
+        own(m_collection);
+    }
     subscribe(EditorCollection::globalObject());
 }
 
 CollectionKeeper::~CollectionKeeper()
 {
-    if (isObserved(m_collection)) {
+    if (isOwned(m_collection)) {
         remove(m_collection);
     }
 }
 
 void CollectionKeeper::notify(const AddFilesToCollection& request)
 {
+    if (!isOwned(m_collection)) {
+        refuse(request);
+        return;
+    }
     std::set<QString> listed = listedFiles(*m_collection);
     UserObject filled(*m_collection);
     for (const Media::File* const file : request.files) {
@@ -70,6 +77,15 @@ void CollectionKeeper::notify(const AddFilesToCollection& request)
     }
     if (filled != *m_collection) {
         change(m_collection)->setItems(std::move(filled.items));
+    }
+}
+
+void CollectionKeeper::refuse(const AddFilesToCollection& request) const
+{
+    const std::deque<const Media::File*> files = request.files;
+    for (const Media::File* const file : files) {
+        PubSub::publish(CollectingFailed(
+            file->path, "is not collected: the user's collection is kept by another module"));
     }
 }
 

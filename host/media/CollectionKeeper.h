@@ -25,6 +25,9 @@ namespace Host {
 ///
 /// Requests from other modules to change the collection are granted unless they list null; requests to remove
 /// it are refused.
+///
+/// A collection that another module owns already is left to it: for each file of a request CollectingFailed
+/// goes out.
 class CollectionKeeper : private Message::View<EditorCollection::UserObject>,
                          private PubSub::Subscriber<AddFilesToCollection>
 {
@@ -50,6 +53,7 @@ private:
     using CollectionView = Message::View<EditorCollection::UserObject>;
 
     void notify(const AddFilesToCollection& request) override;
+    void refuse(const AddFilesToCollection& request) const;
     void changeRequested(EditorCollection::UserObject* collection,
                          EditorCollection::UserObject* value) override;
     void removeRequested(EditorCollection::UserObject* collection) override;

@@ -4,6 +4,7 @@
 #include "host/commands/Refusal.h"
 #include "host/media/AddFilesToCollection.h"
 #include "host/media/AddingFailed.h"
+#include "host/media/CollectingFailed.h"
 #include "host/media/CollectionKeeper.h"
 #include "host/media/FileFacts.h"
 #include "host/media/FileNotAdded.h"
@@ -57,6 +58,25 @@ public:
 
 private:
     void notify(const AddingFailed& message) override { m_reasons[message.path] = message.reason; }
+
+    std::map<QString, QString> m_reasons;
+};
+
+/// Why files are not listed in the user's collection, as whoever was to list them tells.
+class CollectionReasons : private PubSub::Subscriber<CollectingFailed>
+{
+public:
+    CollectionReasons() { subscribe(EditorCollection::globalObject()); }
+
+    QString of(const QString& path) const
+    {
+        const auto reason = m_reasons.find(path);
+        return reason == m_reasons.end() ? "is not collected: no module keeps the user's collection"
+                                         : reason->second;
+    }
+
+private:
+    void notify(const CollectingFailed& message) override { m_reasons[message.path] = message.reason; }
 
     std::map<QString, QString> m_reasons;
 };
@@ -226,12 +246,12 @@ void FileImporter::Run::fillCollection()
     for (const Candidate* const candidate : opened()) {
         files.push_back(candidate->file);
     }
+    const CollectionReasons reasons;
     if (!files.empty()) {
         PubSub::publish(AddFilesToCollection(files));
     }
     for (const Candidate* const candidate : missing(filesOfCollections())) {
-        refuse(*candidate, FileNotAdded::CollectionPlace,
-               "is not collected: no module keeps the user's collection");
+        refuse(*candidate, FileNotAdded::CollectionPlace, reasons.of(candidate->path));
     }
 }
 

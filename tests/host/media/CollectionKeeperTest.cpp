@@ -3,6 +3,7 @@
 
 #include "tests/host/shared/Samples.h"
 
+#include "host/media/CollectingFailed.h"
 #include "host/media/CollectionKeeper.h"
 
 #include <EditorModel/library/CollectionIds.h>
@@ -229,6 +230,50 @@ TEST(CollectionKeeper, LetsNobodyRemoveTheCollection)
     keeper.reset();
     EXPECT_TRUE(client.isRemoved);
     EXPECT_THAT(client.enumerateAll(), IsEmpty());
+}
+
+/// Writes down why files are not collected.
+class FailureList : private PubSub::Subscriber<Host::CollectingFailed>
+{
+public:
+    FailureList() { subscribe(EditorCollection::globalObject()); }
+
+    Lines lines;
+
+private:
+    void notify(const Host::CollectingFailed& message) override
+    {
+        lines.push_back((message.path + ' ' + message.reason).toStdString());
+    }
+};
+
+TEST(CollectionKeeper, LeavesACollectionToTheModuleThatOwnsIt)
+{
+    UserObject collection;
+    Message::View<UserObject> owner;
+    owner.own(&collection);
+    Client client(&collection);
+    const FailureList failures;
+    const File film("/film", File::Film);
+    const File sound("/sound", File::Sound);
+    {
+        const Keeper keeper(&collection);
+        EXPECT_EQ(keeper.collection(), &collection);
+        request({&film, &sound});
+        EXPECT_THAT(failures.lines,
+                    ElementsAre("/film is not collected: the user's collection is kept by another module",
+                                "/sound is not collected: the user's collection is kept by another module"));
+        EXPECT_THAT(collection.items, IsEmpty());
+    }
+    EXPECT_THAT(client.lines, IsEmpty());
+    EXPECT_FALSE(client.isRemoved);
+    EXPECT_TRUE(owner.isOwned(&collection));
+    // The owner has let go of it.
+    owner.remove(&collection);
+    const Keeper next(&collection);
+    request({&film});
+    EXPECT_THAT(collection.items, SizeIs(1));
+    EXPECT_THAT(failures.lines, SizeIs(2));
 }
 
 TEST(CollectionKeeper, FreesTheItemsThatItMade)

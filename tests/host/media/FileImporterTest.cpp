@@ -294,6 +294,27 @@ TEST(FileImporterAlone, TellsWhichOtherModulesAreMissing)
                             "answer 3:"}));
 }
 
+TEST(FileImporterAlone, TellsWhyACollectionIsNotFilled)
+{
+    EditorCollection::UserObject kept;
+    Message::View<EditorCollection::UserObject> owner;
+    owner.own(&kept);
+    const Host::CollectionKeeper keeper(&kept);
+    Lines lines;
+    const Requests requests(lines);
+    EditSession session;
+    const Importer importer(session);
+    const Host::MediaOpener opener;
+    EXPECT_EQ(FileAdder::addMediaFiles({sample("speech.wav")}, anywhere,
+                                       Contexts().setContext(UserCollectionContext())),
+              Importer::NoneAdded);
+    EXPECT_EQ(lines, Lines({"asked: speech.wav", "for collection: speech.wav",
+                            "speech.wav not in collection: is not collected: the user's collection is kept "
+                            "by another module",
+                            "answer 3:"}));
+    EXPECT_THAT(kept.items, testing::IsEmpty());
+}
+
 TEST(FileImporterAlone, FreesEverythingThatItMade)
 {
     Host::showMediaLibraryLog(false);
