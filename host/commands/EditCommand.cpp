@@ -65,6 +65,8 @@ const char* const editCommands =
   speed CLIP FACTOR [ripple]            1 plays the source as it is
   reverse CLIP
   fade-in CLIP LENGTH, fade-out CLIP LENGTH
+  enable CLIP, disable CLIP             a video with its sound
+  volume CLIP PERCENT                   100 is that of the source; of a video, its sound
   transition add CLIP CLIP [LENGTH [NAME]]   - for either makes it one-sided; NAME may be in a package
   transition remove TRANSITION
   track add ROLE                        primary, extra-video, native-audio, audio, title or quiz
@@ -85,7 +87,7 @@ ExitCode editProject(const QString& path, const QStringList& words, const QStrin
         fill(shelf, packages);
         ProjectDocument document = ProjectDocument::load(path);
         ProjectModules modules(contentOf(document));
-        EditScript script(modules.session(), modules.places(), &shelf);
+        EditScript script(modules.session(), modules.clips(), modules.places(), &shelf);
         for (const QStringList& command : commandsOf(words)) {
             script.run(command);
         }

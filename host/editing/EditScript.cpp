@@ -27,8 +27,9 @@ void append(std::vector<const T*>& numbered, const std::vector<const T*>& presen
 
 } // namespace
 
-EditScript::EditScript(EditSession& session, const FileAdder::Contexts& places, const PackageShelf* shelf)
-    : m_session(session), m_places(places), m_shelf(shelf), m_media(session)
+EditScript::EditScript(EditSession& session, ClipKeeper& keeper, const FileAdder::Contexts& places,
+                       const PackageShelf* shelf)
+    : m_session(session), m_keeper(keeper), m_places(places), m_shelf(shelf), m_media(session)
 {
     numberTheNew();
 }
@@ -63,6 +64,9 @@ const std::vector<EditScript::Command>& EditScript::commands()
         {"reverse", 2, 2, &EditScript::reverse},
         {"fade-in", 3, 3, &EditScript::fadeIn},
         {"fade-out", 3, 3, &EditScript::fadeOut},
+        {"enable", 2, 2, &EditScript::enable},
+        {"disable", 2, 2, &EditScript::disable},
+        {"volume", 3, 3, &EditScript::setVolume},
         {"delete", 2, 2, &EditScript::lift},
         {"extract", 2, 2, &EditScript::extract},
         {"link", 3, 3, &EditScript::link},

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "host/editing/ClipKeeper.h"
 #include "host/editing/EditSession.h"
 #include "host/media/MediaClips.h"
 
@@ -21,10 +22,11 @@ class PackageShelf;
 class EditScript
 {
 public:
-    /// Media that are added go to the timeline, and to these places besides. Titles and transitions may come
-    /// from the shelf, which outlives the script.
-    explicit EditScript(EditSession& session, const FileAdder::Contexts& places = {},
-                        const PackageShelf* shelf = nullptr);
+    /// The keeper is that of the clips of the session's timeline. Media that are added go to the timeline,
+    /// and to these places besides. Titles and transitions may come from the shelf, which outlives the
+    /// script.
+    EditScript(EditSession& session, ClipKeeper& keeper, const FileAdder::Contexts& places = {},
+               const PackageShelf* shelf = nullptr);
     EditScript(const EditScript&) = delete;
 
     /// One command. Throws Refusal, by which the command is named, and has changed nothing of the timeline
@@ -55,6 +57,9 @@ private:
     EditResult reverse(const QStringList& words);
     EditResult fadeIn(const QStringList& words);
     EditResult fadeOut(const QStringList& words);
+    EditResult enable(const QStringList& words);
+    EditResult disable(const QStringList& words);
+    EditResult setVolume(const QStringList& words);
     EditResult lift(const QStringList& words);
     EditResult extract(const QStringList& words);
     EditResult link(const QStringList& words);
@@ -74,6 +79,7 @@ private:
     void numberTheNew();
 
     EditSession& m_session;
+    ClipKeeper& m_keeper;
     FileAdder::Contexts m_places;
     const PackageShelf* m_shelf;
     MediaClips m_media;

@@ -116,6 +116,21 @@ EditResult EditScript::fadeOut(const QStringList& words)
     return m_session.setFades(clip, timeline().clipTiming(clip).fadeInDuration, timeAt(words[2]));
 }
 
+EditResult EditScript::enable(const QStringList& words)
+{
+    return m_keeper.setEnabled(clipAt(words[1]), true);
+}
+
+EditResult EditScript::disable(const QStringList& words)
+{
+    return m_keeper.setEnabled(clipAt(words[1]), false);
+}
+
+EditResult EditScript::setVolume(const QStringList& words)
+{
+    return m_keeper.setVolume(clipAt(words[1]), percentAt(words[2]));
+}
+
 EditResult EditScript::lift(const QStringList& words)
 {
     return m_session.lift(clipAt(words[1]));

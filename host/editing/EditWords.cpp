@@ -104,6 +104,16 @@ double numberAt(const QString& word)
     return number;
 }
 
+int percentAt(const QString& word)
+{
+    bool isNumber = false;
+    const int percent = word.toInt(&isNumber);
+    if (!isNumber || percent < 0) {
+        reject(quoted(word) + " is no volume: whole percents are, from 0 on");
+    }
+    return percent;
+}
+
 int levelAt(const QString& word)
 {
     bool isLevel = false;

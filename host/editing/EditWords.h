@@ -32,6 +32,8 @@ const Timeline::Clip* clipOf(const Timeline::Object& timeline,
 /// A speed.
 double factorAt(const QString& word);
 double numberAt(const QString& word);
+/// A volume: whole percents from 0 on.
+int percentAt(const QString& word);
 int levelAt(const QString& word);
 TrackType roleAt(const QString& word);
 /// The last word of a command may ask the later clips to follow; there may be none at the index.

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "host/editing/ClipKeeper.h"
 #include "host/editing/EditSession.h"
 #include "host/media/CollectionKeeper.h"
 #include "host/media/FileImporter.h"
@@ -27,6 +28,7 @@ public:
     ~ProjectModules() override;
 
     EditSession& session() { return m_session; }
+    ClipKeeper& clips() { return m_clips; }
     /// Where media go besides the timeline.
     const FileAdder::Contexts& places() const { return m_places; }
 
@@ -35,6 +37,7 @@ private:
     ResourceKeeper m_resources;
     std::optional<CollectionKeeper> m_collection;
     EditSession m_session;
+    ClipKeeper m_clips{m_session.timeline()};
     FileImporter m_importer{m_session};
     FileAdder::Contexts m_places;
 };

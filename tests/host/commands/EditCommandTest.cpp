@@ -100,6 +100,27 @@ TEST(EditCommand, SetsFades)
     EXPECT_EQ(timingAt(document, 6).fadeOutDuration, MTime(250));
 }
 
+TEST(EditCommand, SwitchesClipsAndSetsTheirVolume)
+{
+    const FilmProject project;
+    const ProjectDocument off = project.edited("disable long.mkv then disable picture.png , disable 4");
+    for (const int number : {2, 3, 4, 5}) {
+        EXPECT_FALSE(clipAt(off, number)->enabled) << number;
+    }
+    EXPECT_TRUE(clipAt(off, 1)->enabled);
+    EXPECT_TRUE(clipAt(off, 6)->enabled);
+    EXPECT_THAT(editormodel({"show", project.path()}).output, HasSubstr("disabled"));
+    // A clip that an edit has made can be switched as well.
+    const ProjectDocument on = project.edited("enable 3 then split 3 8 then disable 7");
+    EXPECT_TRUE(clipAt(on, 3)->enabled);
+    EXPECT_FALSE(clipAt(on, 4)->enabled);
+    EXPECT_EQ(timingAt(on, 4).timestamp, MTime(8000));
+    const ProjectDocument loud = project.edited("volume speech.wav 35 then volume film.mp4 120");
+    EXPECT_EQ(clipAt(loud, 8)->volume, 35);
+    EXPECT_EQ(clipAt(loud, 5)->volume, 120);
+    EXPECT_EQ(clipAt(loud, 1)->volume, 100);
+}
+
 TEST(EditCommand, AddsAndRemovesTransitions)
 {
     const FilmProject project;
@@ -177,6 +198,12 @@ TEST(EditCommand, RefusesInOneLineAndLeavesTheDocumentAsItIs)
         {"speed 1 0", "speed 1 0: "},
         {"speed 1 fast", "speed 1 fast: \"fast\" is no speed: 2 and 0.5 are\n"},
         {"fade-in 6 2", "fade-in 6 2: "},
+        {"volume 6 -1", "volume 6 -1: \"-1\" is no volume: whole percents are, from 0 on\n"},
+        {"volume 6 12.5", "volume 6 12.5: \"12.5\" is no volume: "},
+        {"volume 2 50",
+         "volume 2 50: The clip \"picture.png\" at 00:00:02.000 has no sound, and so no volume.\n"},
+        {"enable nobody", "enable nobody: there is no clip \"nobody\"\n"},
+        {"disable 1 2", "disable 1 2: has a word too many\n"},
         {"transition add 1 3", "transition add 1 3: "},
         {"transition add 1 2 0", "transition add 1 2 0: \"0\" is no length of a transition\n"},
         {"transition remove 1", "transition remove 1: there is no transition \"1\"\n"},

@@ -34,7 +34,7 @@ protected:
         EXPECT_TRUE(session.addTrack(primary));
         EXPECT_TRUE(session.append({a, primary}));
         EXPECT_TRUE(session.append({b, primary}));
-        script = std::make_unique<Host::EditScript>(session);
+        script = std::make_unique<Host::EditScript>(session, clipKeeper);
     }
 
     void run(const QStringList& words) { EXPECT_EQ(refusalOf(words), "") << words.join(' ').toStdString(); }
@@ -59,6 +59,7 @@ protected:
     const Host::MediaOpener opener;
     const HostTests::Folder folder;
     EditSession session;
+    Host::ClipKeeper clipKeeper{session.timeline()};
     const Host::FileImporter importer{session};
     Track* primary = session.makeTrack(PrimaryTrack);
     Clip* a = session.makeClip(Clip::VideoClip);
@@ -199,8 +200,8 @@ TEST_F(EditScript, AddsMediaToTheOtherPlacesOfTheProject)
     EditorCollection::UserObject collection;
     const Host::CollectionKeeper keeper(&collection);
     FileAdder::Contexts places;
-    script =
-        std::make_unique<Host::EditScript>(session, places.setContext(FileAdder::UserCollectionContext()));
+    script = std::make_unique<Host::EditScript>(session, clipKeeper,
+                                                places.setContext(FileAdder::UserCollectionContext()));
     const auto listed = [&] {
         std::string names;
         for (const Import::Object* item : collection.items) {
@@ -226,7 +227,8 @@ TEST_F(EditScript, TellsWhyMediaAreNotAdded)
                 StartsWith(HostTests::sample("picture.png").toStdString() +
                            " can't be laid: The clip \"a\" can't be split at 00:00:00.005: "));
     EditSession alone;
-    Host::EditScript lonely(alone);
+    Host::ClipKeeper lonelyKeeper(alone.timeline());
+    Host::EditScript lonely(alone, lonelyKeeper);
     try {
         lonely.run({"add", HostTests::sample("picture.png")});
         ADD_FAILURE() << "nobody can add it";
@@ -261,7 +263,7 @@ protected:
         package.writeDescription();
         EXPECT_EQ(shelf.put(folder.path("extras")), 1u);
         EXPECT_THAT(shelf.faults(), IsEmpty());
-        script = std::make_unique<Host::EditScript>(session, FileAdder::Contexts(), &shelf);
+        script = std::make_unique<Host::EditScript>(session, clipKeeper, FileAdder::Contexts(), &shelf);
     }
 
     Host::PackageShelf shelf;
