@@ -2,12 +2,15 @@
 // What envelopes look like in a client's archives, written down by hand.
 #include <EditorModel/effects/TransformationPreset.h>
 #include <EditorModel/persistence/Json.h>
+#include <EditorModel/persistence/streams/Streams.h>
 
 #include <boost/archive/xml_iarchive.hpp>
 #include <boost/archive/xml_oarchive.hpp>
 #include <boost/serialization/nvp.hpp>
 
 #include <gtest/gtest.h>
+
+#include <QBuffer>
 
 #include <memory>
 #include <sstream>
@@ -71,6 +74,23 @@ TEST(EnvelopeDocument, OfAVolumeIsRead)
     boost::archive::xml_iarchive archive(stream);
     VolumeEnvelope content;
     archive >> BOOST_SERIALIZATION_NVP(content);
+    expectFalling(content);
+}
+
+TEST(EnvelopeDocument, ThatIsAFieldStreamAddsItsKeysBehindThoseThatAreThere)
+{
+    QBuffer buffer;
+    buffer.open(QIODevice::WriteOnly);
+    const auto writer = Serialize::makeStreamWriter(Document::Json, buffer);
+    writer->writeObject(fallingEnvelope());
+    writer->finish();
+
+    VolumeEnvelope content;
+    content.addKeyValue(0.75, 0.125);
+    Serialize::makeStreamReader(Document::Json, buffer.data())->readObject(content);
+    ASSERT_EQ(content.keyValues.size(), 3u);
+    EXPECT_EQ(content.keyValues.front().step, 0.75);
+    content.keyValues.pop_front();
     expectFalling(content);
 }
 

@@ -4,10 +4,15 @@
 
 #include <EditorModel/library/Pack.h>
 #include <EditorModel/library/PackCatalogue.h>
+#include <EditorModel/persistence/streams/Streams.h>
 
 #include <gmock/gmock.h>
 
+#include <QBuffer>
+
+#include <memory>
 #include <type_traits>
+#include <vector>
 
 namespace {
 
@@ -181,6 +186,27 @@ TEST_F(PackCatalogue, ThatWasLoadedListsItsPacksAndFindsNoneUntilItIsAdded)
         EXPECT_EQ(loaded.findPack("first"), loaded.packs[1]);
         EXPECT_EQ(loaded.findPack("second"), nullptr);
     }
+}
+
+TEST_F(PackCatalogue, PutsThePacksOfAFieldStreamBehindItsOwn)
+{
+    catalogue.addPack(&second)->addPack(&first);
+    QBuffer buffer;
+    buffer.open(QIODevice::WriteOnly);
+    const auto writer = Serialize::makeStreamWriter(Document::Json, buffer);
+    writer->writeObject(catalogue);
+    writer->finish();
+
+    Catalogue filled;
+    filled.addPack(&otherFirst);
+    const auto reader = Serialize::makeStreamReader(Document::Json, buffer.data());
+    reader->readObject(filled);
+    std::vector<std::unique_ptr<Serialize::ISerializable>> made(reader->made().begin(), reader->made().end());
+    ASSERT_EQ(filled.packs.size(), 3);
+    EXPECT_EQ(filled.packs[0], &otherFirst);
+    EXPECT_EQ(filled.packs[1]->appId, "second");
+    EXPECT_EQ(filled.packs[2]->appId, "first");
+    EXPECT_EQ(filled.findPack("first"), &otherFirst);
 }
 
 TEST_F(PackCatalogue, IsMadeByName)

@@ -91,8 +91,8 @@ class EDITORMODEL_EXPORT Fields
 public:
     /// True if the visitor stores into the fields.
     bool loading() const { return m_loading; }
-    /// True if a map that is read into keeps the entries that it has. The field stream adds to maps, and the
-    /// archives replace them, as their libraries do.
+    /// True if a container that is read into keeps what it has. The field stream adds to containers, and the
+    /// archives replace what is in them, as their libraries do.
     bool keepsEntries() const { return m_keepsEntries; }
 
     /// A field. Pointers are nullable and read strictly: an object of another class throws `std::bad_cast`.

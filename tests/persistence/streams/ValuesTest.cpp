@@ -298,7 +298,7 @@ TEST_P(Streams, GiveBackEmptyContainers)
     EXPECT_TRUE(copy.list.isEmpty());
 }
 
-TEST_P(Streams, AddToTheMapsOfAnObjectThatIsReadIntoAndReplaceItsOtherContainers)
+TEST_P(Streams, AddToTheContainersOfAnObjectThatIsReadInto)
 {
     Grove stored;
     stored.numbers = {1, 2};
@@ -326,8 +326,8 @@ TEST_P(Streams, AddToTheMapsOfAnObjectThatIsReadIntoAndReplaceItsOtherContainers
     reader->readObject(grove);
     reader->finish();
 
-    EXPECT_EQ(grove.numbers, (std::deque<int>{1, 2}));
-    EXPECT_EQ(grove.names, (std::set<QString>{"x"}));
+    EXPECT_EQ(grove.numbers, (std::deque<int>{7, 8, 9, 1, 2}));
+    EXPECT_EQ(grove.names, (std::set<QString>{"x", "y"}));
     ASSERT_EQ(grove.named.size(), 3u);
     EXPECT_EQ(grove.named.at("both").number, 1);
     EXPECT_EQ(grove.named.at("both").text, "");

@@ -149,7 +149,7 @@ template <class C>
 void visitSequence(Fields& fields, C& container, SequenceKind kind)
 {
     const int count = fields.beginSequence(kind, static_cast<int>(container.size()));
-    if (fields.loading())
+    if (fields.loading() && !fields.keepsEntries())
         container.clear();
     // Through a constant: a Qt container that is shared must not become one of its own by being looked at.
     auto position = std::as_const(container).begin();
@@ -189,7 +189,7 @@ struct ItemsOf<std::set<T, Less>>
     static void visit(Fields& fields, std::set<T, Less>& items)
     {
         const int count = fields.beginSequence(Collection, static_cast<int>(items.size()));
-        if (fields.loading())
+        if (fields.loading() && !fields.keepsEntries())
             items.clear();
         auto position = items.begin();
         for (int index = 1; index <= count; ++index) {
