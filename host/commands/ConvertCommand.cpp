@@ -1,12 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "host/commands/ConvertCommand.h"
 
+#include "host/analysis/ReplacedTrackings.h"
 #include "host/analysis/TrackingStore.h"
 #include "host/commands/Refusal.h"
 #include "host/project/DocumentFile.h"
+#include "host/project/FileReplacement.h"
 #include "host/project/GraphComparison.h"
 #include "host/project/ProjectFile.h"
 #include "host/project/ProjectStore.h"
+#include "host/text/DisplayText.h"
 
 #include <EditorModel/library/Project.h>
 #include <EditorModel/persistence/Document.h>
@@ -29,15 +32,36 @@ Roots rootsOf(const Document::Graph& graph)
     return Roots(graph.roots().begin(), graph.roots().end());
 }
 
+bool isOntoItself(const ConvertOptions& options)
+{
+    return QFileInfo(options.input).canonicalFilePath() == QFileInfo(options.output).canonicalFilePath();
+}
+
 void requireFree(const ConvertOptions& options)
 {
-    if (options.isForced || !QFileInfo::exists(options.output)) {
-        return;
-    }
-    const bool isInput =
-        QFileInfo(options.input).canonicalFilePath() == QFileInfo(options.output).canonicalFilePath();
-    throw Refusal(options.output, isInput ? "is what is to be converted; --force replaces it"
+    if (!options.isForced && QFileInfo::exists(options.output)) {
+        throw Refusal(options.output, isOntoItself(options)
+                                          ? "is what is to be converted; --force replaces it"
                                           : "exists already; --force replaces it");
+    }
+}
+
+/// Where the output is another project, or what is left of one, the folder of its trackings. Empty for what
+/// is converted onto itself, which keeps them.
+QString foreignTrackings(const ConvertOptions& options)
+{
+    try {
+        return isOntoItself(options) ? QString() : TrackingStore::folderOf(options.output);
+    } catch (const ReplacementFailed& failed) {
+        throw Refusal(options.output, failed.what());
+    }
+}
+
+bool tellKept(const QString& output, const QString& trackings)
+{
+    return trackings.isEmpty() ||
+           writeOutput(printable(output) + ": the trackings of the project that was replaced are kept in " +
+                       printable(trackings) + '\n');
 }
 
 Document::Form formOf(const QString& path)
@@ -143,8 +167,9 @@ ExitCode convert(const ConvertOptions& options)
         TrackingStore trackings;
         const Document::Graph graph = load(options, trackings);
         requireWhole(trackings);
+        ReplacedTrackings replaced(foreignTrackings(options));
         write(graph, options.output, trackings);
-        return Success;
+        return tellKept(options.output, replaced.settle()) ? Success : Failure;
     });
 }
 

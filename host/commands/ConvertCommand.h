@@ -12,7 +12,8 @@ struct ConvertOptions
     QString input;
     /// The ending tells the form.
     QString output;
-    /// The output may replace a file that is there, and be the input itself.
+    /// The output may replace a file that is there, and be the input itself. Trackings of a project that it
+    /// replaces are kept, beside its own, and it is told where.
     bool isForced = false;
     /// Binary and XML archives are read too; they must be of one's own making.
     bool isOwn = false;

@@ -15,12 +15,14 @@
 #include <EditorModel/persistence/Document.h>
 #include <EditorModel/types/Image.h>
 
+#include <QDir>
 #include <QFileInfo>
 #include <QImage>
 
 #include <gmock/gmock.h>
 
 #include <limits>
+#include <map>
 
 namespace {
 
@@ -196,6 +198,120 @@ TEST(ConvertCommand, ReplacesAFileOnlyByForce)
     expectDone(editormodel({"convert", "--force", "in.json", "in.json"}, folder.path()));
     EXPECT_EQ(textOf(Host::ProjectStore::open(folder.path("in.json")).graph()),
               textOf({&everything.content}));
+}
+
+/// The projects one.json and two.json, each with trackings of its own and one that has the name of the
+/// other's.
+class ReplacingConversion : public testing::Test
+{
+protected:
+    ReplacingConversion()
+    {
+        save("one.json", {{"face", 0.125}, {"shared", 0.25}});
+        save("two.json", {{"hand", 0.5}, {"shared", 0.75}});
+    }
+
+    void save(const char* name, const std::map<QString, double>& trackings) const
+    {
+        Host::TrackingStore store;
+        for (const auto& [id, left] : trackings) {
+            MotionTracking::Data data(id);
+            data.frames[0].left = left;
+            store.put(data);
+        }
+        Host::ProjectStore::save(m_everything.content, m_folder.path(name));
+    }
+    Outcome convert(const QString& input, const QString& output) const
+    {
+        return editormodel({"convert", "--force", input, output}, m_folder.path());
+    }
+    /// What is in a folder of trackings: where each is in its first picture.
+    std::map<QString, double> trackingsIn(const QString& folder) const
+    {
+        Host::TrackingStore store;
+        store.load(m_folder.path(folder));
+        std::map<QString, double> found;
+        for (const QString& id : store.ids()) {
+            found[id] = store.find(id)->frames.at(0).left;
+        }
+        return found;
+    }
+
+    using Trackings = std::map<QString, double>;
+    const Trackings m_one = {{"face", 0.125}, {"shared", 0.25}};
+    const Trackings m_two = {{"hand", 0.5}, {"shared", 0.75}};
+    const Folder m_folder{};
+    const Everything m_everything{};
+};
+
+TEST_F(ReplacingConversion, KeepsTheTrackingsOfTheReplacedProjectBesideTheNewOnes)
+{
+    const Outcome outcome = convert("one.json", "two.json");
+    EXPECT_EQ(outcome.exitCode, 0);
+    EXPECT_EQ(outcome.errors, "");
+    EXPECT_EQ(outcome.output, "two.json: the trackings of the project that was replaced are kept in "
+                              "two.json.data/trackings-replaced\n");
+    EXPECT_EQ(trackingsIn("two.json.data/trackings"), m_one);
+    EXPECT_EQ(trackingsIn("two.json.data/trackings-replaced"), m_two);
+    EXPECT_EQ(trackingsIn("one.json.data/trackings"), m_one);
+
+    // The same once more loses nothing, and another project again nothing.
+    expectDone(convert("one.json", "two.json"));
+    EXPECT_EQ(trackingsIn("two.json.data/trackings-replaced"), m_two);
+    save("three.json", {});
+    EXPECT_THAT(convert("three.json", "two.json").output, HasSubstr("two.json.data/trackings-replaced-2\n"));
+    EXPECT_EQ(trackingsIn("two.json.data/trackings"), Trackings());
+    EXPECT_EQ(trackingsIn("two.json.data/trackings-replaced"), m_two);
+    EXPECT_EQ(trackingsIn("two.json.data/trackings-replaced-2"), m_one);
+}
+
+TEST_F(ReplacingConversion, KeepsTheTrackingsOfAProjectThatAPlainDocumentReplaces)
+{
+    const Timeline::Object timeline;
+    Document::saveFile(m_folder.path("plain.json"), {&timeline}, Document::Json, Document::Stream);
+    EXPECT_THAT(convert("plain.json", "two.json").output, HasSubstr("two.json.data/trackings-replaced\n"));
+    EXPECT_EQ(trackingsIn("two.json.data/trackings"), Trackings());
+    EXPECT_EQ(trackingsIn("two.json.data/trackings-replaced"), m_two);
+}
+
+TEST_F(ReplacingConversion, KeepsADamagedTrackingToo)
+{
+    m_folder.write("two.json.data/trackings/t-hand.json", "{");
+    EXPECT_EQ(convert("one.json", "two.json").exitCode, 0);
+    EXPECT_EQ(contentOf(m_folder.path("two.json.data/trackings-replaced/t-hand.json")), "{");
+    EXPECT_FALSE(QFileInfo::exists(m_folder.path("two.json.data/trackings/t-hand.json")));
+}
+
+TEST_F(ReplacingConversion, OntoItselfKeepsItsTrackingsWhereTheyAre)
+{
+    expectDone(convert("one.json", "./one.json"));
+    EXPECT_EQ(trackingsIn("one.json.data/trackings"), m_one);
+    ASSERT_TRUE(QFile::link(m_folder.path("one.json"), m_folder.path("link.json")));
+    expectDone(convert("one.json", "link.json"));
+    EXPECT_EQ(trackingsIn("one.json.data/trackings"), m_one);
+    EXPECT_EQ(QDir(m_folder.path("one.json.data")).entryList(QDir::AllEntries | QDir::NoDotAndDotDot),
+              QStringList("trackings"));
+}
+
+TEST_F(ReplacingConversion, PutsTheTrackingsBackWhereNothingIsReplaced)
+{
+    // A folder stands where the draft of the new file would be made.
+    ASSERT_TRUE(QDir(m_folder.path()).mkpath(".two.json.saving/full"));
+    const QByteArray before = contentOf(m_folder.path("two.json"));
+    const Outcome outcome = convert("one.json", "two.json");
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_THAT(outcome.errors, StartsWith("two.json: cannot be written"));
+    EXPECT_EQ(contentOf(m_folder.path("two.json")), before);
+    EXPECT_EQ(trackingsIn("two.json.data/trackings"), m_two);
+    EXPECT_FALSE(QFileInfo::exists(m_folder.path("two.json.data/trackings-replaced")));
+}
+
+TEST_F(ReplacingConversion, RefusesALinkThatLeadsInACircle)
+{
+    ASSERT_TRUE(QFile::link("loop.json", m_folder.path("loop.json")));
+    const Outcome outcome = convert("one.json", "loop.json");
+    EXPECT_EQ(outcome.exitCode, 1);
+    EXPECT_EQ(outcome.errors, "loop.json: is a link that leads in a circle\n");
 }
 
 TEST(ConvertCommand, ADamagedInputLeavesNoOutput)
