@@ -32,6 +32,8 @@ FilmstripMaker::FilmstripMaker(std::map<ResourceRef, MediaPlace> places) : m_pla
     processAddRequests();
 }
 
+FilmstripMaker::~FilmstripMaker() = default;
+
 void FilmstripMaker::addRequested(Filmstrip::Object* filmstrip)
 {
     FilmstripView::addRequested(filmstrip);
@@ -60,22 +62,35 @@ std::shared_ptr<Filmstrip::Payload> FilmstripMaker::thumbnailsOf(const Filmstrip
     return payload;
 }
 
+PictureReader* FilmstripMaker::readerOf(const MediaPlace& place)
+{
+    if (!m_place || m_place->path != place.path || m_place->track != place.track) {
+        m_place = place;
+        m_reader.reset();
+        try {
+            m_reader = std::make_unique<PictureReader>(place.path, place.track);
+        } catch (const MediaError& error) {
+            m_failures[place.path] = error.reason;
+        }
+    }
+    return m_reader.get();
+}
+
 void FilmstripMaker::takePictures(Filmstrip::Payload& payload, const MediaPlace& place)
 {
-    try {
-        PictureReader reader(place.path, place.track);
-        const Thumbnail::Object* before = nullptr;
-        for (const Thumbnail::Object& thumbnail : payload.pictures) {
-            auto image = before && *before == thumbnail ? before->image : nullptr;
-            if (!image) {
-                image = std::make_shared<const Types::Image>(QPixmap::fromImage(
-                    reader.at(thumbnail.position, QSize(thumbnail.width, thumbnail.height))));
-            }
-            m_thumbnails.change(&thumbnail)->setImage(image);
-            before = &thumbnail;
+    PictureReader* const reader = readerOf(place);
+    if (!reader) {
+        return;
+    }
+    const Thumbnail::Object* before = nullptr;
+    for (const Thumbnail::Object& thumbnail : payload.pictures) {
+        auto image = before && *before == thumbnail ? before->image : nullptr;
+        if (!image) {
+            image = std::make_shared<const Types::Image>(
+                QPixmap::fromImage(reader->at(thumbnail.position, QSize(thumbnail.width, thumbnail.height))));
         }
-    } catch (const MediaError& error) {
-        m_failures[place.path] = error.reason;
+        m_thumbnails.change(&thumbnail)->setImage(image);
+        before = &thumbnail;
     }
 }
 

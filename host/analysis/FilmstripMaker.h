@@ -10,6 +10,7 @@
 #include <deque>
 #include <map>
 #include <memory>
+#include <optional>
 #include <vector>
 
 namespace Filmstrip {
@@ -25,6 +26,8 @@ public:
 
 namespace Host {
 
+class PictureReader;
+
 /// Where a resource is.
 struct MediaPlace
 {
@@ -39,14 +42,16 @@ struct MediaPlace
 std::vector<MTime> picturePositions(const Filmstrip::Object& filmstrip);
 
 /// The module that fills filmstrips: it owns every one that is added on the bus, and the thumbnails that it
-/// makes of it. A filmstrip has its pictures, and is bumped, when the request to add it returns. A
-/// QGuiApplication must be there.
+/// makes of it. A filmstrip has its pictures, and is bumped, when the request to add it returns. The file of
+/// the last one stays open, so that whoever asks for those of one file together, in the order of their
+/// sources, is served quickest. A QGuiApplication must be there.
 class FilmstripMaker : private Message::View<Filmstrip::Object>
 {
 public:
     /// Other resources have no pictures.
     explicit FilmstripMaker(std::map<ResourceRef, MediaPlace> places);
     FilmstripMaker(const FilmstripMaker&) = delete;
+    ~FilmstripMaker() override;
 
     /// Why media could not be read, by their paths: one line each that completes "The file ...".
     const std::map<QString, QString>& failures() const { return m_failures; }
@@ -56,10 +61,15 @@ private:
 
     void addRequested(Filmstrip::Object* filmstrip) override;
     std::shared_ptr<Filmstrip::Payload> thumbnailsOf(const Filmstrip::Object& filmstrip);
+    /// Null for what cannot be read.
+    PictureReader* readerOf(const MediaPlace& place);
     void takePictures(Filmstrip::Payload& payload, const MediaPlace& place);
 
     const std::map<ResourceRef, MediaPlace> m_places;
     std::map<QString, QString> m_failures;
+    /// Of the reader.
+    std::optional<MediaPlace> m_place;
+    std::unique_ptr<PictureReader> m_reader;
     std::deque<std::shared_ptr<const Filmstrip::Payload>> m_payloads;
     Message::View<Thumbnail::Object> m_thumbnails;
 };

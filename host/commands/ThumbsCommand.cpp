@@ -2,6 +2,7 @@
 #include "host/commands/ThumbsCommand.h"
 
 #include "host/analysis/FilmstripMaker.h"
+#include "host/commands/ProgressBar.h"
 #include "host/commands/Refusal.h"
 #include "host/project/ProjectDocument.h"
 #include "host/text/DisplayText.h"
@@ -12,6 +13,8 @@
 
 #include <QDir>
 #include <QFileInfo>
+
+#include <cstdio>
 
 namespace Host {
 namespace {
@@ -26,6 +29,12 @@ std::map<ResourceRef, MediaPlace> pictureMedia(const TimelineOutline& outline, c
         }
     }
     return places;
+}
+
+void fill(ClipFilmstrips& filmstrips)
+{
+    const ProgressBar bar(filmstrips.progress(), stderr);
+    filmstrips.request();
 }
 
 QString besideDocument(const QString& document)
@@ -45,7 +54,8 @@ ExitCode drawThumbs(const QString& document, const QString& picturePath)
         const ProjectDocument loaded = ProjectDocument::load(document);
         TimelinePicture picture(loaded.timeline(), info.completeBaseName());
         const FilmstripMaker maker(pictureMedia(picture.outline(), info.absoluteDir()));
-        const ClipFilmstrips filmstrips(picture.layout(), picture.outline());
+        ClipFilmstrips filmstrips(picture.layout(), picture.outline());
+        fill(filmstrips);
         picture.showFilmstrips(&filmstrips);
         savePicture(picture, path, form);
         for (const auto& [file, reason] : maker.failures()) {

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "host/timeline/ClipFilmstrips.h"
 
+#include "host/analysis/FilmstripMaker.h"
 #include "host/drawing/Picture.h"
 #include "host/editing/TimelineInvariants.h"
 #include "host/media/ResourceKeeper.h"
@@ -10,6 +11,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <tuple>
 
 namespace Host {
 namespace {
@@ -69,46 +71,89 @@ ResourceRef pictureResourceOf(const Timeline::Clip& clip)
 
 ClipFilmstrips::ClipFilmstrips(const TimelineLayout& layout, const TimelineOutline& outline)
 {
+    std::size_t pictures = 0;
     for (const Timeline::Clip* clip : outline.clips()) {
-        const Media::Video* const video = videoOf(*clip);
-        const QRectF box = layout.boxOf(clip);
-        if (!video || clipStrip(box).isEmpty()) {
-            continue;
-        }
-        const double height = clipBody(box).height();
-        const double width = std::max(height * shapeOf(*video), leastPictureWidth);
-        const Timeline::ClipTiming& timing = outline.timeline().clips.at(clip);
-        const Types::Range stretch = stretchOf(*clip, timing);
-        if (!isWithin(stretch)) {
-            continue;
-        }
-        const auto shown = double(stretch.length().ms());
-        // At least one, so that each picture has a time of its own.
-        const MTime step = std::max(MTime(1), MTime::fromMsRound(shown * width / box.width()));
-        add(&m_filmstrips[clip])
-            ->setResource(pictureResourceOf(*clip))
-            ->setWidth(int(std::lround(width * pngScale)))
-            ->setHeight(int(std::lround(height * pngScale)))
-            ->setSourceDuration(clip->sourceDuration)
-            ->setTimingMode(timing.timingMode)
-            ->setSourceRange(stretch)
-            ->setCurrentRange(stretch)
-            ->setStep(step)
-            ->setReversed(timing.reversed);
+        setFilmstrip(*clip, outline.timeline().clips.at(clip), layout.boxOf(clip));
+        const Filmstrip::Object* const filmstrip = of(*clip);
+        pictures += filmstrip ? picturePositions(*filmstrip).size() : 0;
     }
+    m_reporter.own(&m_progress)->setTotal(int(pictures));
 }
 
 ClipFilmstrips::~ClipFilmstrips()
 {
+    m_reporter.remove(&m_progress);
     for (const auto& entry : m_filmstrips) {
-        remove(&entry.second);
+        if (isObserved(&entry.second)) {
+            remove(&entry.second);
+        }
     }
+}
+
+void ClipFilmstrips::request()
+{
+    subscribeAll<Thumbnail::Object>();
+    int passed = 0;
+    for (const Timeline::Clip* const clip : clipsByFile()) {
+        Filmstrip::Object& filmstrip = m_filmstrips.at(clip);
+        m_reporter.change(&m_progress)->setPassed(passed)->setLabel(clip->file->path);
+        add(&filmstrip);
+        passed += int(picturePositions(filmstrip).size());
+    }
+    unsubscribeAll<Thumbnail::Object>();
+    m_reporter.change(&m_progress)->setPassed(passed);
 }
 
 const Filmstrip::Object* ClipFilmstrips::of(const Timeline::Clip& clip) const
 {
     const auto found = m_filmstrips.find(&clip);
     return found == m_filmstrips.end() ? nullptr : &found->second;
+}
+
+/// A picture has come.
+void ClipFilmstrips::notify(const Message::Types::Changed<Thumbnail::Object>&)
+{
+    m_reporter.change(&m_progress)->setPassed(m_progress.passed + 1);
+}
+
+/// A clip without a video, and one that is too narrow for pictures, has none.
+void ClipFilmstrips::setFilmstrip(const Timeline::Clip& clip, const Timeline::ClipTiming& timing,
+                                  const QRectF& box)
+{
+    const Media::Video* const video = videoOf(clip);
+    const Types::Range stretch = stretchOf(clip, timing);
+    if (!video || clipStrip(box).isEmpty() || !isWithin(stretch)) {
+        return;
+    }
+    const double height = clipBody(box).height();
+    const double width = std::max(height * shapeOf(*video), leastPictureWidth);
+    const auto shown = double(stretch.length().ms());
+    // At least one, so that each picture has a time of its own.
+    const MTime step = std::max(MTime(1), MTime::fromMsRound(shown * width / box.width()));
+    m_filmstrips[&clip]
+        .setResource(pictureResourceOf(clip))
+        ->setWidth(int(std::lround(width * pngScale)))
+        ->setHeight(int(std::lround(height * pngScale)))
+        ->setSourceDuration(clip.sourceDuration)
+        ->setTimingMode(timing.timingMode)
+        ->setSourceRange(stretch)
+        ->setCurrentRange(stretch)
+        ->setStep(step)
+        ->setReversed(timing.reversed);
+}
+
+std::vector<const Timeline::Clip*> ClipFilmstrips::clipsByFile() const
+{
+    std::vector<const Timeline::Clip*> clips;
+    for (const auto& entry : m_filmstrips) {
+        clips.push_back(entry.first);
+    }
+    const auto key = [this](const Timeline::Clip* clip) {
+        const Types::Range& stretch = m_filmstrips.at(clip).sourceRange;
+        return std::make_tuple(clip->file->path, clip->mediaTrack, stretch.from, stretch.to);
+    };
+    std::sort(clips.begin(), clips.end(), [&key](const auto* a, const auto* b) { return key(a) < key(b); });
+    return clips;
 }
 
 } // namespace Host

@@ -1,12 +1,19 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/host/shared/Pictures.h"
+#include "tests/host/shared/Samples.h"
 
 #include "host/analysis/FilmstripMaker.h"
 #include "host/analysis/PictureReader.h"
 
 #include <EditorModel/types/Image.h>
 
+#include <QFile>
+
 #include <gmock/gmock.h>
+
+#include <deque>
+#include <utility>
+#include <vector>
 
 namespace {
 
@@ -116,6 +123,57 @@ TEST(FilmstripMaker, FillsWhatIsAdded)
     EXPECT_NEAR(patchIn(pictures[0].image->toImage()), 70, 1);
     EXPECT_NEAR(patchIn(pictures[1].image->toImage()), 50, 1);
     EXPECT_THAT(maker.failures(), IsEmpty());
+}
+
+TEST(FilmstripMaker, OpensAFileOnceForFilmstripsThatFollowOneAnother)
+{
+    const Folder folder;
+    const QString path = folder.copy("patch.mkv", "patch.mkv");
+    const FilmstripMaker maker({{film, MediaPlace{path, 0}}});
+    std::deque<Filmstrip::Object> strips(3);
+    std::deque<Watcher> watchers;
+    // From the middle, on from there, and back to the start.
+    for (const auto& [strip, from] : {std::pair(0, 400), std::pair(1, 600), std::pair(2, 0)}) {
+        Filmstrip::Object& asked = strips[std::size_t(strip)];
+        asked.setResource(film)->setWidth(160)->setHeight(120)->setSourceDuration(1000);
+        asked.setSourceRange(from, from + 80)->setStep(40);
+        watchers.emplace_back(&asked);
+        // Only what is open can still be read.
+        QFile::remove(path);
+    }
+    const auto patchAt = [&](int strip, int picture) {
+        const auto& image = strips[std::size_t(strip)].payload->pictures[std::size_t(picture)].image;
+        return image ? patchIn(image->toImage()) : -2;
+    };
+    // Pictures 10, 11, 15, 16, 0 and 1.
+    EXPECT_NEAR(patchAt(0, 0), 42, 1);
+    EXPECT_NEAR(patchAt(0, 1), 44, 1);
+    EXPECT_NEAR(patchAt(1, 0), 52, 1);
+    EXPECT_NEAR(patchAt(1, 1), 54, 1);
+    EXPECT_NEAR(patchAt(2, 0), 22, 1);
+    EXPECT_NEAR(patchAt(2, 1), 24, 1);
+    EXPECT_THAT(maker.failures(), IsEmpty());
+}
+
+TEST(FilmstripMaker, TakesPicturesOutOfSeveralFilesInTurn)
+{
+    const ResourceRef still("still", Resource::ImageType);
+    const ResourceRef none("none", Resource::VideoType);
+    const FilmstripMaker maker({{film, MediaPlace{sample("patch.mkv"), 0}},
+                                {still, MediaPlace{sample("picture.png"), 0}},
+                                {none, MediaPlace{sample("patch.mkv"), 7}}});
+    std::deque<Filmstrip::Object> strips(5);
+    std::deque<Watcher> watchers;
+    std::vector<bool> shown;
+    std::size_t next = 0;
+    for (const ResourceRef& resource : {film, still, none, none, film}) {
+        Filmstrip::Object& asked = strips[next++];
+        asked.setResource(resource)->setWidth(160)->setHeight(120)->setSourceRange(0, 1000)->setStep(1000);
+        watchers.emplace_back(&asked);
+        shown.push_back(asked.payload->pictures.front().image != nullptr);
+    }
+    EXPECT_THAT(shown, ElementsAre(true, true, false, false, true));
+    EXPECT_THAT(maker.failures(), ElementsAre(Pair(sample("patch.mkv"), QString("has no video track 7"))));
 }
 
 TEST(FilmstripMaker, SharesThePictureOfAStill)
