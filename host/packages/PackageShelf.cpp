@@ -240,9 +240,12 @@ void PackageShelf::notify(const Package::GetPackagesRequest& request)
     PubSub::publish(Package::GetPackagesNotification(request.sender, directories, unread));
 }
 
-/// Notes what is wrong with the place itself.
+/// Notes what is wrong with the place itself, in place of what was.
 std::set<QString> PackageShelf::foldersOf(const QString& place)
 {
+    const auto isAboutPlace = [&place](const PackageFault& fault) { return fault.package == place; };
+    m_placeFaults.erase(std::remove_if(m_placeFaults.begin(), m_placeFaults.end(), isAboutPlace),
+                        m_placeFaults.end());
     const QFileInfo info(place);
     if (!info.isDir()) {
         m_placeFaults.push_back({place, {}, info.exists() ? "is no folder" : "does not exist"});

@@ -351,6 +351,23 @@ TEST_F(Shelf, NamesPlacesThatAreNoFolders)
     EXPECT_THAT(shelf.faults(), SizeIs(2)) << "each once";
 }
 
+TEST_F(Shelf, NamesAPlaceOnceThoughItIsPutAgain)
+{
+    Host::PackageShelf shelf;
+    const QString late = folder.path("late");
+    EXPECT_EQ(shelf.put(late), 0u);
+    EXPECT_EQ(shelf.put(folder.path("never")), 0u);
+    EXPECT_EQ(shelf.put(late), 0u);
+    ASSERT_THAT(shelf.faults(), SizeIs(2));
+    EXPECT_EQ(shelf.faults()[0].package, folder.path("never"));
+    EXPECT_EQ(shelf.faults()[1].package, late);
+    // By now it is there.
+    writeEffectPackage(late, "late.warm");
+    EXPECT_EQ(shelf.put(late), 1u);
+    ASSERT_THAT(shelf.faults(), SizeIs(1));
+    EXPECT_EQ(shelf.faults()[0].package, folder.path("never"));
+}
+
 /// What a message that is going round tells of is there until it has gone round.
 TEST_F(Shelf, KeepsWhatIsTakenOffWhileARequestAboutItIsAnswered)
 {
