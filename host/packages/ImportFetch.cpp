@@ -175,13 +175,19 @@ void ImportFetch::listFolder(const QString& path, const QString& appId)
     m_isFolder = true;
     m_name = appId;
     const QDir root(path);
-    QDirIterator files(path, QDir::Files | QDir::Hidden | QDir::System, QDirIterator::Subdirectories);
-    while (files.hasNext()) {
-        const QString file = files.next();
-        if (files.fileInfo().isSymLink() || !files.fileInfo().isFile()) {
-            throw ImportError(NotReadable, file + ": is not a regular file");
+    QDirIterator entries(path, QDir::AllEntries | QDir::Hidden | QDir::System | QDir::NoDotAndDotDot,
+                         QDirIterator::Subdirectories);
+    while (entries.hasNext()) {
+        const QString entry = entries.next();
+        const QFileInfo info = entries.fileInfo();
+        if (info.isSymLink()) {
+            throw ImportError(NotReadable, entry + ": is a link; packs are fetched without any");
         }
-        m_files.push_back({file, m_name + '/' + root.relativeFilePath(file), files.fileInfo().size()});
+        if (info.isFile()) {
+            m_files.push_back({entry, m_name + '/' + root.relativeFilePath(entry), info.size()});
+        } else if (!info.isDir()) {
+            throw ImportError(NotReadable, entry + ": is not a regular file");
+        }
     }
     if (m_files.empty()) {
         throw ImportError(NotReadable, path + ": holds no files");

@@ -17,6 +17,8 @@
 #include <utility>
 #include <vector>
 
+#include <sys/stat.h>
+
 namespace {
 
 using namespace HostTests;
@@ -576,9 +578,22 @@ TEST_F(PackImports, FailWhereTheIdentifierIsNoNameOfAFolder)
 
 TEST_F(PackImports, FailForPackedFilesAndForFoldersWithLinks)
 {
-    ASSERT_TRUE(QFile::link("/etc/passwd", folder.path("remote/looks/link")));
-    Lines heard = fetch();
+    const QString link = folder.path("remote/looks/link");
+    Lines heard;
+    // To a file, a folder, the folder itself, and nothing.
+    for (const char* const target : {"/etc/passwd", "/etc", ".", "nowhere"}) {
+        ASSERT_TRUE(QFile::link(target, link));
+        heard = fetch();
+        EXPECT_EQ(heard.back(), "a failed 0 error 3") << target;
+        EXPECT_THAT(heard, testing::Contains("because " + link.toStdString() +
+                                             ": is a link; packs are fetched without any"));
+        EXPECT_THAT(fetchedFiles(), IsEmpty());
+        ASSERT_TRUE(QFile::remove(link));
+    }
+    ASSERT_EQ(mkfifo(link.toUtf8().constData(), 0600), 0);
+    heard = fetch();
     EXPECT_EQ(heard.back(), "a failed 0 error 3");
+    EXPECT_THAT(heard, testing::Contains("because " + link.toStdString() + ": is not a regular file"));
     const_cast<Package::InApp::Pack*>(item.pack)->downloadUrl = folder.write("remote/looks.zip", "PK");
     heard = fetch();
     EXPECT_EQ(heard.back(), "a failed 0 error 7");
