@@ -87,7 +87,7 @@ ExitCode editProject(const QString& path, const QStringList& words, const QStrin
         fill(shelf, packages);
         ProjectDocument document = ProjectDocument::load(path);
         ProjectModules modules(contentOf(document));
-        EditScript script(modules.session(), modules.clips(), modules.places(), &shelf);
+        EditScript script(modules.session(), modules.clips(), modules.media(), modules.places(), &shelf);
         for (const QStringList& command : commandsOf(words)) {
             script.run(command);
         }

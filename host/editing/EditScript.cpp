@@ -27,9 +27,9 @@ void append(std::vector<const T*>& numbered, const std::vector<const T*>& presen
 
 } // namespace
 
-EditScript::EditScript(EditSession& session, ClipKeeper& keeper, const FileAdder::Contexts& places,
-                       const PackageShelf* shelf)
-    : m_session(session), m_keeper(keeper), m_places(places), m_shelf(shelf), m_media(session)
+EditScript::EditScript(EditSession& session, ClipKeeper& keeper, MediaClips& media,
+                       const FileAdder::Contexts& places, const PackageShelf* shelf)
+    : m_session(session), m_keeper(keeper), m_places(places), m_shelf(shelf), m_media(media)
 {
     numberTheNew();
 }

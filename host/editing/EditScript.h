@@ -22,11 +22,11 @@ class PackageShelf;
 class EditScript
 {
 public:
-    /// The keeper is that of the clips of the session's timeline. Media that are added go to the timeline,
-    /// and to these places besides. Titles and transitions may come from the shelf, which outlives the
-    /// script.
-    EditScript(EditSession& session, ClipKeeper& keeper, const FileAdder::Contexts& places = {},
-               const PackageShelf* shelf = nullptr);
+    /// The keeper is that of the clips of the session's timeline, and `media` makes clips for it. Media that
+    /// are added go to the timeline, and to these places besides. Titles and transitions may come from the
+    /// shelf, which outlives the script.
+    EditScript(EditSession& session, ClipKeeper& keeper, MediaClips& media,
+               const FileAdder::Contexts& places = {}, const PackageShelf* shelf = nullptr);
     EditScript(const EditScript&) = delete;
 
     /// One command. Throws Refusal, by which the command is named, and has changed nothing of the timeline
@@ -82,7 +82,7 @@ private:
     ClipKeeper& m_keeper;
     FileAdder::Contexts m_places;
     const PackageShelf* m_shelf;
-    MediaClips m_media;
+    MediaClips& m_media;
     std::vector<const Timeline::Clip*> m_clips;
     std::vector<const Timeline::Track*> m_tracks;
     std::vector<const Transition::Object*> m_transitions;

@@ -181,8 +181,10 @@ FileImporter::Run::Candidate FileImporter::Run::open(const QString& path)
 {
     const MediaDescriber::Entry*& entry = m_entries[path];
     if (!entry) {
-        entry = isOurTimeline() ? &m_importer.m_clips.open(path)
-                                : &m_describer.describe(path.isEmpty() ? path : absolutePath(path));
+        entry = isOurTimeline() ? &m_importer.m_clips.open(path) : m_importer.m_clips.find(path);
+    }
+    if (!entry) {
+        entry = &m_describer.describe(path.isEmpty() ? path : absolutePath(path));
     }
     const bool isOpened = entry->file.isOpened;
     const Candidate candidate = {path, entry->file.path, isOpened ? &entry->file : nullptr, false};

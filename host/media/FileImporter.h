@@ -53,6 +53,10 @@ public:
     FileImporter(const FileImporter&) = delete;
     FileImporter& operator=(const FileImporter&) = delete;
 
+    /// Those of the timeline, and the files that are open for them, which are not opened again for another
+    /// place.
+    MediaClips& clips() { return m_clips; }
+
 private:
     class Run;
 

@@ -20,6 +20,11 @@ struct Parts
     bool sound;
 };
 
+QString wholePath(const QString& path)
+{
+    return path.isEmpty() ? path : absolutePath(path);
+}
+
 Parts partsOf(const QString& path, MediaClips::Strategy strategy, Clip::ClipType type)
 {
     const bool isKnown = strategy == MediaClips::PictureWithSound || strategy == MediaClips::PictureAlone ||
@@ -55,13 +60,19 @@ EditResult place(EditSession& session, const MediaClips::Clips& clips, const Lay
 
 const MediaDescriber::Entry& MediaClips::open(const QString& path)
 {
-    const QString whole = path.isEmpty() ? path : absolutePath(path);
+    const MediaDescriber::Entry* const found = find(path);
+    return found ? *found : m_describer.describe(wholePath(path));
+}
+
+const MediaDescriber::Entry* MediaClips::find(const QString& path) const
+{
+    const QString whole = wholePath(path);
     for (const MediaDescriber::Entry& entry : m_describer.entries()) {
         if (entry.file.isOpened && entry.file.path == whole) {
-            return entry;
+            return &entry;
         }
     }
-    return m_describer.describe(whole);
+    return nullptr;
 }
 
 MediaClips::Clips MediaClips::make(const QString& path)

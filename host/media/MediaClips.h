@@ -40,6 +40,8 @@ public:
     /// The file at the path; one that is open for these clips is taken as it is. The path is made absolute,
     /// so that a project finds its media from any folder.
     const MediaDescriber::Entry& open(const QString& path);
+    /// The file at the path if it is open for these clips; null if it isn't.
+    const MediaDescriber::Entry* find(const QString& path) const;
 
     /// A video with its sound, a sound, or a picture of the length that pictures have by default. Throws
     /// Refusal for a file that can't be opened, or whose length is not known.

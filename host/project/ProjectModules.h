@@ -29,6 +29,7 @@ public:
 
     EditSession& session() { return m_session; }
     ClipKeeper& clips() { return m_clips; }
+    MediaClips& media() { return m_importer.clips(); }
     /// Where media go besides the timeline.
     const FileAdder::Contexts& places() const { return m_places; }
 

@@ -13,9 +13,16 @@
 #include "host/project/ProjectStore.h"
 
 #include <EditorModel/effects/Overlay.h>
+#include <EditorModel/media/File.h>
 #include <EditorModel/persistence/Document.h>
 
+#include <QFileInfo>
+
 #include <gmock/gmock.h>
+
+#include <set>
+#include <string>
+#include <vector>
 
 namespace {
 
@@ -34,7 +41,7 @@ protected:
         EXPECT_TRUE(session.addTrack(primary));
         EXPECT_TRUE(session.append({a, primary}));
         EXPECT_TRUE(session.append({b, primary}));
-        script = std::make_unique<Host::EditScript>(session, clipKeeper);
+        script = std::make_unique<Host::EditScript>(session, clipKeeper, importer.clips());
     }
 
     void run(const QStringList& words) { EXPECT_EQ(refusalOf(words), "") << words.join(' ').toStdString(); }
@@ -60,7 +67,7 @@ protected:
     const HostTests::Folder folder;
     EditSession session;
     Host::ClipKeeper clipKeeper{session.timeline()};
-    const Host::FileImporter importer{session};
+    Host::FileImporter importer{session};
     Track* primary = session.makeTrack(PrimaryTrack);
     Clip* a = session.makeClip(Clip::VideoClip);
     Clip* b = session.makeClip(Clip::VideoClip);
@@ -200,7 +207,7 @@ TEST_F(EditScript, AddsMediaToTheOtherPlacesOfTheProject)
     EditorCollection::UserObject collection;
     const Host::CollectionKeeper keeper(&collection);
     FileAdder::Contexts places;
-    script = std::make_unique<Host::EditScript>(session, clipKeeper,
+    script = std::make_unique<Host::EditScript>(session, clipKeeper, importer.clips(),
                                                 places.setContext(FileAdder::UserCollectionContext()));
     const auto listed = [&] {
         std::string names;
@@ -219,6 +226,47 @@ TEST_F(EditScript, AddsMediaToTheOtherPlacesOfTheProject)
     EXPECT_EQ(listed(), "picture.png\nfilm.mp4\n");
 }
 
+/// Writes down which files are opened.
+class Openings : private Message::View<Media::File>
+{
+public:
+    Openings() { observeNew(); }
+
+    std::vector<std::string> names;
+
+private:
+    using View::changed;
+    void changed(const Media::File* file, const Media::File* old) override
+    {
+        if (file->isOpened && !old->isOpened) {
+            names.push_back(QFileInfo(file->path).fileName().toStdString());
+        }
+    }
+};
+
+TEST_F(EditScript, OpensAFileOnceForAllPlacesAndEdits)
+{
+    EditorCollection::UserObject collection;
+    const Host::CollectionKeeper keeper(&collection);
+    FileAdder::Contexts places;
+    places.setContext(FileAdder::UserCollectionContext());
+    script = std::make_unique<Host::EditScript>(session, clipKeeper, importer.clips(), places);
+    const Openings openings;
+    run({"overwrite", HostTests::sample("film.mp4"), "9"});
+    run({"overwrite", HostTests::sample("speech.wav"), "1"});
+    run({"add", HostTests::sample("film.mp4")});
+    run({"overwrite", HostTests::sample("film.mp4"), "14"});
+    EXPECT_THAT(openings.names, testing::ElementsAre("film.mp4", "speech.wav"));
+    EXPECT_EQ(collection.items.size(), 2u);
+    std::set<const Media::File*> films;
+    for (const auto& [clip, timing] : now().clips) {
+        if (clip->name == "film.mp4") {
+            films.insert(clip->file);
+        }
+    }
+    EXPECT_EQ(films.size(), 1u);
+}
+
 TEST_F(EditScript, TellsWhyMediaAreNotAdded)
 {
     EXPECT_EQ(refusalOf({"add", HostTests::sample("picture.png"), "-1ms"}),
@@ -228,7 +276,8 @@ TEST_F(EditScript, TellsWhyMediaAreNotAdded)
                            " can't be laid: The clip \"a\" can't be split at 00:00:00.005: "));
     EditSession alone;
     Host::ClipKeeper lonelyKeeper(alone.timeline());
-    Host::EditScript lonely(alone, lonelyKeeper);
+    Host::MediaClips lonelyMedia(alone);
+    Host::EditScript lonely(alone, lonelyKeeper, lonelyMedia);
     try {
         lonely.run({"add", HostTests::sample("picture.png")});
         ADD_FAILURE() << "nobody can add it";
@@ -263,7 +312,8 @@ protected:
         package.writeDescription();
         EXPECT_EQ(shelf.put(folder.path("extras")), 1u);
         EXPECT_THAT(shelf.faults(), IsEmpty());
-        script = std::make_unique<Host::EditScript>(session, clipKeeper, FileAdder::Contexts(), &shelf);
+        script = std::make_unique<Host::EditScript>(session, clipKeeper, importer.clips(),
+                                                    FileAdder::Contexts(), &shelf);
     }
 
     Host::PackageShelf shelf;
