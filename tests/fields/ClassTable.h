@@ -285,7 +285,8 @@ struct MemberType<F (C::*)() const>
 template <auto Member>
 using TypeOf = typename MemberType<decltype(Member)>::Type;
 
-/// Puts a table together, a row for each field: its name and default, by its member and its setter.
+/// Puts a table together, a row for each field, in the order of the class: its name and default, by its
+/// member and its setter.
 template <class C>
 class ClassOf : public ClassTable
 {

@@ -7,6 +7,7 @@
 #include <gmock/gmock.h>
 
 #include <algorithm>
+#include <functional>
 #include <map>
 #include <set>
 #include <string>
@@ -237,6 +238,26 @@ TEST(Moves, LeaveAnObjectThatCanBeAssignedAgain)
         for (Instance* const left : {&object, &source}) {
             left->assign(moved);
             expectContent(*left, content, table, "is not assigned to an object that was moved from");
+        }
+    }
+}
+
+// Modules that were built apart meet in the layout of the records, so that the order of the fields in memory
+// is a part of the interface. It is not the order in which they are stored.
+TEST(Layout, HasTheFieldsOfAClassInTheOrderOfItsRows)
+{
+    for (const ClassTable& table : classes()) {
+        const Instance object(table);
+        const FieldRow* last = nullptr;
+        for (const FieldRow& row : table.fields) {
+            const bool isMemberOfItsOwn = row.path.empty() && !row.write;
+            if (!isMemberOfItsOwn)
+                continue;
+            if (last) {
+                EXPECT_TRUE(std::less<const void*>()(last->in(object.object()), row.in(object.object())))
+                    << table.name << "::" << row.name << " does not stand behind " << last->name;
+            }
+            last = &row;
         }
     }
 }

@@ -4,7 +4,6 @@
 #include <gtest/gtest.h>
 
 #include <array>
-#include <functional>
 #include <limits>
 
 namespace {
@@ -19,15 +18,6 @@ std::array<double, 4> edgesOf(const Rect& rect)
 TEST(Rect, TakesLeftTopRightBottom)
 {
     EXPECT_EQ((std::array<double, 4>{1, 2, 3, 4}), edgesOf(Rect(1, 2, 3, 4)));
-}
-
-TEST(Rect, HoldsItsEdgesInTheOrderOfItsConstructor)
-{
-    const Rect rect;
-    const std::less<const double*> isBefore;
-    EXPECT_TRUE(isBefore(&rect.left, &rect.top));
-    EXPECT_TRUE(isBefore(&rect.top, &rect.right));
-    EXPECT_TRUE(isBefore(&rect.right, &rect.bottom));
 }
 
 TEST(Rect, EqualsWhatDiffersByLessThanItsPrecision)
