@@ -88,8 +88,7 @@ ClassTable::ClassTable(const char* className, const char* archiveName, const Lif
 ClassTable::ClassTable(const ClassTable& other) = default;
 ClassTable::~ClassTable() = default;
 
-void ClassTable::addField(const char* field, std::shared_ptr<const TriedValues> values, Place place,
-                          Call write)
+void ClassTable::addField(const char* field, SharedValues values, Place place, Call write)
 {
     fields.push_back({field, std::move(values), place, write, {}});
 }

@@ -2,6 +2,7 @@
 #include "FormatClasses.h"
 
 #include <EditorModel/media/FileAnalyzer.h>
+#include <EditorModel/media/ResourceHooks.h>
 #include <EditorModel/media/ResourceInfo.h>
 #include <EditorModel/media/ResourceTable.h>
 #include <EditorModel/media/Source.h>
@@ -124,6 +125,22 @@ ClassTable timing()
         .field<&Timing::loopMinCount>("loopMinCount", 0);
 }
 
+ClassTable resourceTiming()
+{
+    using Resource::ResourceTiming;
+    return ClassOf<ResourceTiming>("Resource::ResourceTiming",
+                                   [](void* memory) { ::new (memory) ResourceTiming(0, 0); })
+        .field<&ResourceTiming::position>("position", 0)
+        .field<&ResourceTiming::duration>("duration", 0);
+}
+
+ClassTable resourceDescriber()
+{
+    using Resource::Describer;
+    return ClassOf<Describer>("Resource::Describer", [](void* memory) { ::new (memory) Describer({}); })
+        .field<&Describer::resource>("resource", {"", Resource::Type(0)});
+}
+
 ClassTable fileResourceInfo()
 {
     using Info = ResourceTable::FileResourceInfo;
@@ -182,9 +199,11 @@ ClassOf<Media::Video> videoFormat()
 
 std::vector<ClassTable> mediaClasses()
 {
-    return {mediaObject(), audioFormat(), videoFormat(),      file(),          track(),
-            audioTrack(),  videoTrack(),  fileTarget(),       source(),        overlaySource(),
-            fileInfo(),    timing(),      fileResourceInfo(), resourceTable(), fileAnalyzer()};
+    return {mediaObject(),    audioFormat(),       videoFormat(),      file(),
+            track(),          audioTrack(),        videoTrack(),       fileTarget(),
+            source(),         overlaySource(),     fileInfo(),         timing(),
+            resourceTiming(), resourceDescriber(), fileResourceInfo(), resourceTable(),
+            fileAnalyzer()};
 }
 
 } // namespace FieldTests

@@ -8,9 +8,7 @@
 #include <EditorModel/library/Project.h>
 #include <EditorModel/library/UserBlob.h>
 #include <EditorModel/media/FileAdder.h>
-#include <EditorModel/media/ResourceHooks.h>
 #include <EditorModel/media/ResourceTable.h>
-#include <EditorModel/timeline/ClipOrder.h>
 
 namespace FieldTests {
 
@@ -218,28 +216,6 @@ ClassTable bareMessage(const char* name)
         .template field<&Message::sender>("sender", nullptr);
 }
 
-ClassTable resourceDescriber()
-{
-    using Resource::Describer;
-    return ClassOf<Describer>("Resource::Describer", [](void* memory) { ::new (memory) Describer({}); })
-        .field<&Describer::resource>("resource", {"", Resource::Type(0)});
-}
-
-ClassTable resourceTiming()
-{
-    using Resource::ResourceTiming;
-    return ClassOf<ResourceTiming>("Resource::ResourceTiming",
-                                   [](void* memory) { ::new (memory) ResourceTiming(0, 0); })
-        .field<&ResourceTiming::position>("position", 0)
-        .field<&ResourceTiming::duration>("duration", 0);
-}
-
-ClassTable clipOrder()
-{
-    return ClassOf<ClipOrder>("ClipOrder", [](void* memory) { ::new (memory) ClipOrder(nullptr); })
-        .field<&ClipOrder::timeline>("timeline", nullptr);
-}
-
 } // namespace
 
 std::vector<ClassTable> messageClasses()
@@ -266,10 +242,7 @@ std::vector<ClassTable> messageClasses()
             getUserBlobsNotification(),
             bareMessage<UserBlob::Details::GetUserBlobsRequest>("UserBlob::Details::GetUserBlobsRequest"),
             bareMessage<ProjectExtraInfo::ProjectContentLoaded>("ProjectExtraInfo::ProjectContentLoaded"),
-            bareMessage<ProjectExtraInfo::ProjectContentSaved>("ProjectExtraInfo::ProjectContentSaved"),
-            resourceDescriber(),
-            resourceTiming(),
-            clipOrder()};
+            bareMessage<ProjectExtraInfo::ProjectContentSaved>("ProjectExtraInfo::ProjectContentSaved")};
 }
 
 } // namespace FieldTests

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "ClassTable.h"
 #include "FormatClasses.h"
 
+#include <EditorModel/timeline/ClipOrder.h>
 #include <EditorModel/timeline/Composition.h>
 #include <EditorModel/timeline/Editor.h>
 #include <EditorModel/timeline/Film.h>
@@ -125,6 +125,12 @@ ClassTable timeline()
         .field<&Object::reservedSecond>("reservedSecond", 0);
 }
 
+ClassTable clipOrder()
+{
+    return ClassOf<ClipOrder>("ClipOrder", [](void* memory) { ::new (memory) ClipOrder(nullptr); })
+        .field<&ClipOrder::timeline>("timeline", nullptr);
+}
+
 ClassTable film()
 {
     using Film::Object;
@@ -236,6 +242,7 @@ std::vector<ClassTable> timelineClasses()
             trackedObject(),
             trackingLinkInfo(),
             timeline(),
+            clipOrder(),
             film(),
             editor(),
             ruler(),
