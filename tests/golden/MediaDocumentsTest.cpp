@@ -1,14 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
-// What documents of media files look like, written down by hand. Stored data is for life: these texts are
-// never written anew from what the code gives.
+// What documents with a media file held by value look like, written down by hand. Stored data is for life:
+// these texts are never written anew from what the code gives.
 #include "TextArchives.h"
 
 #include <EditorModel/media/Media.h>
-#include <EditorModel/persistence/Document.h>
 
 #include <gtest/gtest.h>
-
-#include <QBuffer>
 
 namespace {
 
@@ -85,65 +82,6 @@ constexpr const char* jsonArchive = R"({"content": {
         "Track": {"file": null, "index": 1, "codecId": "aac", "bitrate": 128000}},
         {"$meta": {"class": "AudioTrack", "ref": 3}}]}}})";
 
-constexpr const char* xmlStream = R"(<?xml version="1.0" encoding="UTF-8"?>
-<EditorModel route="stream" version="1">
-    <objects count="1">
-        <Item>
-            <Data class="File" id="1">
-                <path>/films/a &amp; b.mp4</path>
-                <size>5000000000</size>
-                <format>mov</format>
-                <length>90061</length>
-                <isOpening>false</isOpening>
-                <isOpened>true</isOpened>
-                <isFailed>false</isFailed>
-                <videoTracks count="1">
-                    <Item>
-                        <Data class="VideoTrack" id="2">
-                            <BaseOfObject class="Video">
-                                <width>640</width>
-                                <height>360</height>
-                                <frameRateN>24000</frameRateN>
-                                <frameRateD>1001</frameRateD>
-                                <aspectX>4</aspectX>
-                                <aspectY>3</aspectY>
-                            </BaseOfObject>
-                            <BaseOfObject class="Track">
-                                <file ref="1"/>
-                                <index>0</index>
-                                <codecId>h264</codecId>
-                                <bitrate>1500000</bitrate>
-                            </BaseOfObject>
-                            <isImage>true</isImage>
-                        </Data>
-                    </Item>
-                </videoTracks>
-                <audioTracks count="2">
-                    <Item>
-                        <Data class="AudioTrack" id="3">
-                            <BaseOfObject class="Audio">
-                                <channelLayout>63</channelLayout>
-                                <sampleRate>48000</sampleRate>
-                                <sampleFormat>8</sampleFormat>
-                            </BaseOfObject>
-                            <BaseOfObject class="Track">
-                                <file null="true"/>
-                                <index>1</index>
-                                <codecId>aac</codecId>
-                                <bitrate>128000</bitrate>
-                            </BaseOfObject>
-                        </Data>
-                    </Item>
-                    <Item>
-                        <Data ref="3"/>
-                    </Item>
-                </audioTracks>
-            </Data>
-        </Item>
-    </objects>
-</EditorModel>
-)";
-
 class MediaDocuments : public ::testing::Test
 {
 protected:
@@ -219,48 +157,6 @@ TEST_F(MediaDocuments, TheJsonArchiveIsAsWrittenDown)
     loadJson(jsonArchive, content);
     expectWhole(content);
     freeTracks(content);
-}
-
-TEST_F(MediaDocuments, TheXmlStreamIsAsWrittenDown)
-{
-    QBuffer buffer;
-    buffer.open(QIODevice::ReadWrite);
-    Document::save(buffer, m_file, Document::Xml, Document::Stream);
-    EXPECT_EQ(buffer.data().toStdString(), xmlStream);
-
-    QByteArray stored = xmlStream;
-    QBuffer input(&stored);
-    input.open(QIODevice::ReadOnly);
-    const auto graph = Document::load(input);
-    ASSERT_TRUE(graph.rootAs<Media::File>());
-    expectWhole(*graph.rootAs<Media::File>());
-}
-
-/// The key of every field of every class, in archive order.
-TEST(MediaKeys, AreThoseThatAreStored)
-{
-    const auto keysOf = [](const Serialize::ISerializable& object) {
-        nlohmann::json root;
-        {
-            Serialize::Json::oarchive archive(root);
-            const Serialize::ISerializable* const pointer = &object;
-            archive << boost::serialization::make_nvp("object", pointer);
-        }
-        std::string keys;
-        for (const auto& member : root["object"].items()) {
-            if (member.key() != Serialize::Json::MetaDetails::s_meta)
-                keys += member.key() + " ";
-        }
-        return keys;
-    };
-    // The tree sorts its keys.
-    EXPECT_EQ(keysOf(Media::Audio()), "channelLayout sampleFormat sampleRate ");
-    EXPECT_EQ(keysOf(Media::Video()), "aspectX aspectY frameRateD frameRateN height width ");
-    EXPECT_EQ(keysOf(Media::File()),
-              "audioTracks format isFailed isOpened isOpening length path size videoTracks ");
-    EXPECT_EQ(keysOf(Media::File::Track()), "bitrate codecId file index ");
-    EXPECT_EQ(keysOf(Media::File::Track::Audio()), "Audio Track ");
-    EXPECT_EQ(keysOf(Media::File::Track::Video()), "Track Video isImage ");
 }
 
 } // namespace

@@ -4,11 +4,8 @@
 #include "TextArchives.h"
 
 #include <EditorModel/media/ResourceTable.h>
-#include <EditorModel/persistence/Document.h>
 
 #include <gtest/gtest.h>
-
-#include <QBuffer>
 
 namespace {
 
@@ -76,65 +73,6 @@ constexpr const char* jsonArchive = R"({"content": {
             "info": {"path": "", "duration": 0, "track": 0},
             "timing": {"mode": 0, "intro": 0, "outro": 0, "loopMinCount": 0}}}]}}})";
 
-constexpr const char* xmlStream = R"(<?xml version="1.0" encoding="UTF-8"?>
-<EditorModel route="stream" version="1">
-    <objects count="1">
-        <Item>
-            <Data class="ResourceTable::Object" id="1">
-                <resource2fileInfo count="2">
-                    <Item>
-                        <Key count="2">
-                            <Item>
-                                <Data>a &amp; b</Data>
-                            </Item>
-                            <Item>
-                                <Data>1</Data>
-                            </Item>
-                        </Key>
-                        <Value class="ResourceTable::FileResourceInfo" id="2">
-                            <info class="Resource::FileInfo" id="3">
-                                <path>/films/a &amp; b.mp4</path>
-                                <duration>61000</duration>
-                                <track>2</track>
-                            </info>
-                            <timing class="Resource::Timing" id="4">
-                                <mode>3</mode>
-                                <intro>500</intro>
-                                <outro>700</outro>
-                                <loopMinCount>4</loopMinCount>
-                            </timing>
-                        </Value>
-                    </Item>
-                    <Item>
-                        <Key count="2">
-                            <Item>
-                                <Data>a &amp; b</Data>
-                            </Item>
-                            <Item>
-                                <Data>3</Data>
-                            </Item>
-                        </Key>
-                        <Value class="ResourceTable::FileResourceInfo" id="5">
-                            <info class="Resource::FileInfo" id="6">
-                                <path></path>
-                                <duration>0</duration>
-                                <track>0</track>
-                            </info>
-                            <timing class="Resource::Timing" id="7">
-                                <mode>0</mode>
-                                <intro>0</intro>
-                                <outro>0</outro>
-                                <loopMinCount>0</loopMinCount>
-                            </timing>
-                        </Value>
-                    </Item>
-                </resource2fileInfo>
-            </Data>
-        </Item>
-    </objects>
-</EditorModel>
-)";
-
 ResourceTable::Object fullTable()
 {
     ResourceTable::FileResourceInfo film;
@@ -167,21 +105,6 @@ TEST(ResourceDocuments, TheJsonArchiveIsAsWrittenDown)
     ResourceTable::Object content;
     loadJson(jsonArchive, content);
     EXPECT_TRUE(content == fullTable());
-}
-
-TEST(ResourceDocuments, TheXmlStreamIsAsWrittenDown)
-{
-    QBuffer buffer;
-    buffer.open(QIODevice::ReadWrite);
-    Document::save(buffer, fullTable(), Document::Xml, Document::Stream);
-    EXPECT_EQ(buffer.data().toStdString(), xmlStream);
-
-    QByteArray stored = xmlStream;
-    QBuffer input(&stored);
-    input.open(QIODevice::ReadOnly);
-    const auto graph = Document::load(input);
-    ASSERT_TRUE(graph.rootAs<ResourceTable::Object>());
-    EXPECT_TRUE(*graph.rootAs<ResourceTable::Object>() == fullTable());
 }
 
 TEST(ResourceDocuments, AnArchiveReplacesTheEntriesOfATableThatItIsReadInto)

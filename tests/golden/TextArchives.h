@@ -12,16 +12,6 @@
 
 namespace GoldenTests {
 
-/// What stands around the fields of an object in its XML archive.
-const std::string begin = R"(<?xml version="1.0" encoding="UTF-8" standalone="yes" ?>
-<!DOCTYPE boost_serialization>
-<boost_serialization signature="serialization::archive" version="18">
-<content class_id="0" tracking_level="1" version="0" object_id="_0">)";
-const std::string end = R"(</content>
-</boost_serialization>
-
-)";
-
 /// The XML archive of an object under the key "content", as any client of the archives writes it.
 template <class T>
 std::string saved(const T& content)
