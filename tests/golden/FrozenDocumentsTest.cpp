@@ -5,7 +5,7 @@
 #include "FieldTable.h"
 #include "FrozenDocument.h"
 #include "TextArchives.h"
-#include "tests/shared/FieldVisitors.h"
+#include "tests/shared/FieldTexts.h"
 
 #include <EditorModel/library/PersistentItem.h>
 #include <EditorModel/services/Statistics.h>
@@ -17,6 +17,7 @@
 #include <gtest/gtest.h>
 
 #include <QBuffer>
+#include <QRegularExpression>
 
 #include <algorithm>
 #include <map>
@@ -170,27 +171,13 @@ TEST_P(ClassDocuments, AreWrittenAgainAsTheyWereRead)
     }
 }
 
-/// Numbers of objects tell nothing about a field.
-std::string withoutNumber(const std::string& line)
-{
-    const std::size_t mark = line.rfind(" #");
-    return mark != std::string::npos && line.find_first_not_of("0123456789", mark + 2) == std::string::npos
-               ? line.substr(0, mark)
-               : line;
-}
-
-/// What each field holds.
+/// What each field holds, without the numbers of objects, which tell nothing about a field.
 std::vector<std::string> fieldsOf(const Serialize::ISerializable& object)
 {
+    static const QRegularExpression number(" #\\d+$", QRegularExpression::MultilineOption);
     std::vector<std::string> fields;
-    for (const std::string& full : linesOf({&object})) {
-        const std::string line = withoutNumber(full);
-        const std::size_t indentation = line.find_first_not_of(' ');
-        if (indentation == 2)
-            fields.push_back(line.substr(line.find(':') + 1));
-        else if (indentation > 2)
-            fields.back() += '\n' + line;
-    }
+    for (const auto& field : Testing::fieldTexts(object))
+        fields.push_back(QString::fromStdString(field.second).remove(number).toStdString());
     return fields;
 }
 
