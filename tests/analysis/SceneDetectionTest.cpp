@@ -6,8 +6,9 @@
 #include <EditorModel/persistence/Serializable.h>
 #include <EditorModel/services/Task.h>
 
-#include <gmock/gmock.h>
+#include <gtest/gtest.h>
 
+#include <set>
 #include <type_traits>
 
 namespace {

@@ -2,10 +2,9 @@
 #include "tests/analysis/Trackings.h"
 #include "tests/types/Printing.h"
 
-#include <gmock/gmock.h>
+#include <gtest/gtest.h>
 
 #include <functional>
-#include <string>
 #include <type_traits>
 #include <vector>
 

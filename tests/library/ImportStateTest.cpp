@@ -3,7 +3,7 @@
 
 #include <EditorModel/library/Import.h>
 
-#include <gmock/gmock.h>
+#include <gtest/gtest.h>
 
 #include <type_traits>
 

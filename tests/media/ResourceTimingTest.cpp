@@ -8,7 +8,6 @@
 #include <rapidcheck/gtest.h>
 
 #include <limits>
-#include <string>
 #include <type_traits>
 #include <utility>
 

@@ -9,8 +9,6 @@
 #include <EditorModel/types/Pen.h>
 #include <EditorModel/types/Rect.h>
 
-#include <QString>
-
 namespace GoldenTests {
 namespace {
 

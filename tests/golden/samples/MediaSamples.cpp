@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Parts.h"
 
+#include <EditorModel/analysis/BeatDetection.h>
+#include <EditorModel/analysis/Stabilization.h>
 #include <EditorModel/media/File.h>
-
-#include <QString>
 
 namespace GoldenTests {
 namespace {

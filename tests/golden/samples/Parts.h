@@ -3,9 +3,7 @@
 
 #include "Sample.h"
 
-#include <EditorModel/analysis/BeatDetection.h>
 #include <EditorModel/analysis/MotionTracking.h>
-#include <EditorModel/analysis/Stabilization.h>
 #include <EditorModel/effects/Envelope.h>
 #include <EditorModel/effects/Quiz.h>
 #include <EditorModel/library/ImportObject.h>

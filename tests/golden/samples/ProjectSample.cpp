@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "Parts.h"
 
+#include <EditorModel/analysis/BeatDetection.h>
+#include <EditorModel/analysis/Stabilization.h>
 #include <EditorModel/effects/Effect.h>
 #include <EditorModel/effects/Overlay.h>
 #include <EditorModel/effects/Transition.h>
