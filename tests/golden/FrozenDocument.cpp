@@ -112,12 +112,6 @@ std::string byteDifference(const std::string& listing, const QByteArray& stored,
 
 } // namespace
 
-const std::vector<Way> allWays = {
-    {Document::Archive, Document::Xml},    {Document::Archive, Document::Json},
-    {Document::Archive, Document::Binary}, {Document::Stream, Document::Xml},
-    {Document::Stream, Document::Json},    {Document::Stream, Document::Binary},
-};
-
 std::string FrozenDocument::fileOf(const std::string& name, const Way& way)
 {
     std::string file = name;

@@ -2,8 +2,7 @@
 #pragma once
 
 #include "samples/Sample.h"
-
-#include <EditorModel/persistence/Document.h>
+#include "tests/archives/Forms.h"
 
 #include <QByteArray>
 
@@ -12,15 +11,6 @@
 #include <vector>
 
 namespace GoldenTests {
-
-/// How a document is stored.
-struct Way
-{
-    Document::Route route;
-    Document::Form form;
-};
-
-extern const std::vector<Way> allWays;
 
 /// The documents that are kept beside the tests, in a folder a route, each as `NAME.xml`, `NAME.json` and
 /// `NAME.hex`: a binary document, byte by byte, with what the bytes stand for behind a `#`. They are for
