@@ -4,5 +4,5 @@
 // Loads the library, and Qt Core and Gui with it, and ends.
 int main()
 {
-    return Timeline::Track().used ? 0 : 1 ? 0 : 1;
+    return Timeline::Track().used ? 0 : 1;
 }

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/analysis/Trackings.h"
-#include "tests/archives/Forms.h"
+#include "tests/shared/DocumentForms.h"
 #include "tests/shared/FieldTexts.h"
 #include "tests/types/Printing.h"
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tests/archives/Forms.h"
+#include "tests/shared/DocumentForms.h"
 
 #include <QByteArray>
 

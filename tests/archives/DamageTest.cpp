@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Damaged documents end in a clear error or in a sound object, and in nothing else.
-#include "tests/archives/Forms.h"
 #include "tests/archives/SampleClasses.h"
+#include "tests/shared/DocumentForms.h"
 #include "tests/shared/FieldVisitors.h"
 
 #include <EditorModel/media/ResourceTable.h>

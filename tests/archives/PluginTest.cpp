@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Persistent classes of a module that is loaded at run time.
-#include "tests/archives/Forms.h"
+#include "tests/shared/DocumentForms.h"
 #include "tests/shared/FieldVisitors.h"
 
 #include <gtest/gtest.h>

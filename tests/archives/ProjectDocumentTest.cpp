@@ -4,7 +4,7 @@
 #include <boost/archive/binary_oarchive.hpp>
 
 #include "tests/archives/CutDocuments.h"
-#include "tests/archives/Forms.h"
+#include "tests/shared/DocumentForms.h"
 #include "tests/shared/FullProject.h"
 #include "tests/shared/LiveAllocations.h"
 #include "tests/shared/TimelineComparison.h"

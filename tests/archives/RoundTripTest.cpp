@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every registered class, in every form and both routes, by one body.
-#include "tests/archives/Forms.h"
 #include "tests/archives/SampleClasses.h"
+#include "tests/shared/DocumentForms.h"
 #include "tests/shared/FieldVisitors.h"
 
 #include <EditorModel/persistence/Type.h>

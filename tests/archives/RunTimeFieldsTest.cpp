@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What a class knows at run time alone stays out of every form and comes back with its defaults.
-#include "tests/archives/Forms.h"
+#include "tests/shared/DocumentForms.h"
 
 #include <EditorModel/media/Media.h>
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "samples/Sample.h"
-#include "tests/archives/Forms.h"
+#include "tests/shared/DocumentForms.h"
 
 #include <QByteArray>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tests/archives/Forms.h"
 #include "tests/library/PackModule.h"
+#include "tests/shared/DocumentForms.h"
 #include "tests/shared/FieldTexts.h"
 
 #include <EditorModel/library/ImportObject.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tests/archives/Forms.h"
+#include "tests/shared/DocumentForms.h"
 #include "tests/shared/FieldTexts.h"
 #include "tests/types/Printing.h"
 
