@@ -1,40 +1,23 @@
 // SPDX-License-Identifier: Apache-2.0
 // Usage: fuzz-seeds FOLDER
-// Writes what the fuzzers begin with: a folder for each, with documents of every persistent class, once as it
-// is made and once with every field set, and a dictionary with the names of the classes.
+// Writes what the fuzzers begin with: a folder for each, with the frozen documents of its form and route,
+// which hold every persistent class with every field set, and a dictionary with the names of the classes.
 #include "BinaryFrame.h"
 
-#include "tests/shared/FieldVisitors.h"
+#include "tests/golden/FrozenDocument.h"
 
-#include <EditorModel/persistence/Document.h>
 #include <EditorModel/persistence/Serializer.h>
-#include <EditorModel/persistence/Type.h>
 
-#include <QBuffer>
 #include <QDir>
 #include <QFile>
-#include <QGuiApplication>
 
 #include <cstdio>
 #include <exception>
-#include <memory>
 #include <stdexcept>
 
 namespace {
 
-struct Way
-{
-    const char* folder;
-    Document::Form form;
-    Document::Route route;
-};
-
-constexpr Way ways[] = {
-    {"json-stream", Document::Json, Document::Stream},
-    {"json-archive", Document::Json, Document::Archive},
-    {"xml-stream", Document::Xml, Document::Stream},
-    {"binary-stream", Document::Binary, Document::Stream},
-};
+using GoldenTests::FrozenDocument;
 
 void write(const QDir& folder, const QString& name, const QByteArray& content)
 {
@@ -50,29 +33,15 @@ QDir folderIn(const QDir& parent, const char* name)
     return QDir(parent.filePath(QLatin1String(name)));
 }
 
-/// As the fuzzers take them: binary documents without their frame.
-QByteArray documentOf(const std::deque<const Serialize::ISerializable*>& roots, const Way& way)
+void writeDocuments(const QDir& root, const char* fuzzer, const Way& way)
 {
-    QBuffer buffer;
-    buffer.open(QIODevice::WriteOnly);
-    Document::save(buffer, roots, way.form, way.route);
-    return buffer.data().mid(way.form == Document::Binary ? Fuzzing::binaryFrameSize : 0);
-}
-
-void writeDocuments(const QDir& root, const Way& way)
-{
-    const QDir folder = folderIn(root, way.folder);
-    write(folder, QStringLiteral("nothing"), documentOf({}, way));
+    const QDir folder = folderIn(root, fuzzer);
+    // The fuzzers take binary documents without their frame.
+    const int skipped = way.form == Document::Binary ? Fuzzing::binaryFrameSize : 0;
+    write(folder, QStringLiteral("nothing"), documentOf({}, way).mid(skipped));
     int number = 0;
-    for (const std::string& name : Serialize::registeredNames()) {
-        const Serialize::Type& type = *Serialize::findType(name);
-        const std::unique_ptr<Serialize::ISerializable> plain(type.serializable(type.create()));
-        Testing::Filler filler;
-        const Serialize::ISerializable* const filled = filler.make(type);
-        ++number;
-        write(folder, QStringLiteral("plain-%1").arg(number), documentOf({plain.get()}, way));
-        write(folder, QStringLiteral("filled-%1").arg(number), documentOf({filled, nullptr, filled}, way));
-    }
+    for (const FrozenDocument& document : FrozenDocument::all(way))
+        write(folder, QString::number(++number), document.bytes.mid(skipped));
 }
 
 void writeResourceTexts(const QDir& root)
@@ -95,16 +64,16 @@ void writeDictionary(const QDir& root)
 
 int main(int argc, char** argv)
 {
-    qputenv("QT_QPA_PLATFORM", "offscreen");
-    const QGuiApplication application(argc, argv);
     if (argc != 2) {
         std::fputs("Usage: fuzz-seeds FOLDER\n", stderr);
         return 2;
     }
     try {
         const QDir root(QFile::decodeName(argv[1]));
-        for (const Way& way : ways)
-            writeDocuments(root, way);
+        writeDocuments(root, "json-stream", {Document::Json, Document::Stream, "JsonStream"});
+        writeDocuments(root, "json-archive", {Document::Json, Document::Archive, "JsonArchive"});
+        writeDocuments(root, "xml-stream", {Document::Xml, Document::Stream, "XmlStream"});
+        writeDocuments(root, "binary-stream", {Document::Binary, Document::Stream, "BinaryStream"});
         writeResourceTexts(root);
         writeDictionary(root);
     } catch (const std::exception& error) {

@@ -130,8 +130,19 @@ std::set<std::string> FrozenDocument::files()
     return names;
 }
 
-FrozenDocument::FrozenDocument(const std::string& name, const Way& way)
-    : form(way.form), text(textOf(folder / fileOf(name, way)))
+std::vector<FrozenDocument> FrozenDocument::all(const Way& way)
+{
+    std::vector<FrozenDocument> documents;
+    for (const std::string& file : files()) {
+        const std::filesystem::path path = file;
+        if (path.parent_path() / "" == folderOf(way.route) && path.extension() == endingOf(way.form))
+            documents.push_back(FrozenDocument(way.form, file));
+    }
+    return documents;
+}
+
+FrozenDocument::FrozenDocument(Document::Form form_, const std::string& file)
+    : form(form_), text(textOf(folder / file))
 {
     if (form != Document::Binary) {
         bytes = QByteArray::fromStdString(text);

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "samples/Sample.h"
 #include "tests/shared/DocumentForms.h"
 
 #include <QByteArray>
@@ -21,9 +20,11 @@ struct FrozenDocument
     static std::string fileOf(const std::string& name, const Way& way);
     /// The names of all files there are.
     static std::set<std::string> files();
+    /// All that are stored in one way.
+    static std::vector<FrozenDocument> all(const Way& way);
 
     /// Throws `std::runtime_error` where there is no such document.
-    FrozenDocument(const std::string& name, const Way& way);
+    FrozenDocument(const std::string& name, const Way& way) : FrozenDocument(way.form, fileOf(name, way)) {}
 
     /// What differs first between the document and `written`, in words; empty where they say the same. Json
     /// has no order of members and no blanks, the other forms are compared to the byte.
@@ -32,6 +33,8 @@ struct FrozenDocument
     QByteArray bytes;
 
 private:
+    FrozenDocument(Document::Form form, const std::string& file);
+
     Document::Form form;
     std::string text;
 };

@@ -5,6 +5,7 @@
 #include "FieldTable.h"
 #include "FrozenDocument.h"
 #include "TextArchives.h"
+#include "samples/Sample.h"
 #include "tests/shared/FieldTexts.h"
 
 #include <EditorModel/library/PersistentItem.h>
